@@ -34,7 +34,8 @@ struct ZlvParm {
 };
 
 /**
- * Makes a copy of a typed value, with a string of its own. A tag outside 501 to 507 is copied alone.
+ * Makes a copy of a typed value, with a string of its own. A tag outside 501 to 507 is copied
+ * alone.
  *
  * @param parm  the value to copy; null gives null
  * @return the copy, which the caller frees with ZlvFreeParm(); null when memory ran out
