@@ -36,7 +36,4 @@ namespace zelvo {
 /// True from the moment close begins to free objects until it has ended: nothing is created then.
 bool isClosing();
 
-/// Counts changes of the registry of objects, so that a walk knows when to begin again.
-uint64_t instancesGeneration();
-
 } // namespace zelvo

@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: Apache-2.0
+// The API mutex: created by the first call that takes it, destroyed by close.
+#include <atomic>
+#include <pthread.h>
+
+#include "ZlvApiMutex.h"
+#include "ZlvDeferredFree.h"
+#include "ZlvMisc.h"
+#include "ZlvToolkitIntl.h"
+
+CxMutex ZLV_TK_API_MUTEX = nullptr;
+ZlvBool ZLV_TK_API_MUTEX_EXISTS = 0;
+
+namespace {
+
+// Keeps two first callers from both creating the API mutex.
+pthread_mutex_t creation = PTHREAD_MUTEX_INITIALIZER;
+
+std::atomic_ref<ZlvBool> exists()
+{
+    return std::atomic_ref<ZlvBool>(ZLV_TK_API_MUTEX_EXISTS);
+}
+
+CxStatus createOnce()
+{
+    CxStatus status{CX_STATUS_OK, 0};
+    pthread_mutex_lock(&creation);
+    if (exists().load(std::memory_order_relaxed) == 0) {
+        status = CxMutexCreate(&ZLV_TK_API_MUTEX);
+        if (status.type == CX_STATUS_OK)
+            exists().store(1, std::memory_order_release);
+    }
+    pthread_mutex_unlock(&creation);
+    return status;
+}
+
+/// Reports a failure; gives 1 for success.
+ZlvBool succeeded(CxStatus status)
+{
+    if (status.type == CX_STATUS_OK)
+        return 1;
+    ZlvReportPlatformErr(status.type, status.code);
+    return 0;
+}
+
+} // namespace
+
+ZlvBool zlvAPIMutexLock(void)
+{
+    if (exists().load(std::memory_order_acquire) == 0 && succeeded(createOnce()) == 0)
+        return 0;
+    return succeeded(CxMutexLock(ZLV_TK_API_MUTEX));
+}
+
+void zlvAPIMutexUnlock(void)
+{
+    if (exists().load(std::memory_order_relaxed) == 0)
+        return;
+    zelvo::freeDeferred();
+    succeeded(CxMutexUnlock(ZLV_TK_API_MUTEX));
+}
+
+void zelvo::destroyApiMutex()
+{
+    if (exists().load(std::memory_order_relaxed) == 0)
+        return;
+    succeeded(CxMutexDestroy(&ZLV_TK_API_MUTEX));
+    exists().store(0, std::memory_order_relaxed);
+}

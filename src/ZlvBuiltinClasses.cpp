@@ -1,0 +1,72 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "ZlvBuiltinClasses.h"
+
+#include "ZlvBasicFormatter.h"
+#include "ZlvConsoleHandler.h"
+#include "ZlvIntl.h"
+#include "ZlvLevelFilter.h"
+
+namespace {
+
+struct BuiltinClass {
+    const char *name;
+    ZlvObjClass entries; ///< all but the name
+};
+
+constexpr BuiltinClass builtins[] = {
+    {"zlv_basiclogger",
+     {.kind = ZLV_KIND_LOGGER,
+      .name = nullptr,
+      .description = nullptr,
+      .logger = {.fLog = ZlvBasicObjectFLog},
+      .fAllocVars = nullptr,
+      .fFreeVars = nullptr,
+      .fCfgChange = ZlvBasicLoggerFCfgChange}},
+    {"zlv_levelfilter",
+     {.kind = ZLV_KIND_FILTER,
+      .name = nullptr,
+      .description = nullptr,
+      .filter = {.fProcess = ZlvBasicFilterFProcess,
+                 .fIsLoggable = ZlvLevelFilterFIsLoggable,
+                 .fLog = ZlvBasicObjectFLog},
+      .fAllocVars = nullptr,
+      .fFreeVars = nullptr,
+      .fCfgChange = ZlvLevelFilterFCfgChange}},
+    {"zlv_consolehandler",
+     {.kind = ZLV_KIND_HANDLER,
+      .name = nullptr,
+      .description = nullptr,
+      .handler = {.fProcess = ZlvConsoleUHandlerFProcess,
+                  .fOpen = ZlvConsoleHandlerFOpen,
+                  .fClose = ZlvConsoleHandlerFClose},
+      .fAllocVars = ZlvConsoleHandlerFAllocVars,
+      .fFreeVars = ZlvConsoleHandlerFFreeVars,
+      .fCfgChange = ZlvBasicHandlerFCfgChange}},
+    {"zlv_basicformatter",
+     {.kind = ZLV_KIND_FORMATTER,
+      .name = nullptr,
+      .description = nullptr,
+      .formatter = {.fFormat = ZlvBasicUFormatterFFormat,
+                    .fGetHeader = ZlvBasicFormatterFGetHeader,
+                    .fGetTrailer = ZlvBasicFormatterFGetTrailer,
+                    .fBindMsg = zlvIntlBindUI18Msg},
+      .fAllocVars = nullptr,
+      .fFreeVars = nullptr,
+      .fCfgChange = ZlvBasicFormatterFCfgChange}},
+};
+
+} // namespace
+
+void zelvo::forEachBuiltinClass(void (*take)(const char *name, ZlvObjClass *objClass))
+{
+    for (const BuiltinClass &builtin : builtins) {
+        ZlvObjClass *record = zlvInitObjectClass(builtin.name, builtin.entries.kind, nullptr,
+                                                 nullptr, nullptr, nullptr);
+        if (record == nullptr)
+            continue;
+        char *name = record->name;
+        *record = builtin.entries;
+        record->name = name;
+        take(name, record);
+    }
+}
