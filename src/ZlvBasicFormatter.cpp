@@ -90,7 +90,7 @@ void addSourceLine(Record &record, const ZlvEvent *event)
     if (found == 0)
         return;
     char digits[12];
-    std::snprintf(digits, sizeof digits, "%d", line);
+    static_cast<void>(std::snprintf(digits, sizeof digits, "%d", line));
     record.addField(digits);
 }
 

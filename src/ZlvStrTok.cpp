@@ -3,14 +3,18 @@
 #include "ZlvStrTok.h"
 
 #include <cstring>
-#include <string_view>
 
 #include "CxMemory.h"
 
 namespace {
 
-/// The next token; empty, at the place where the search ended, when there is none.
-std::string_view nextToken(ZlvStrTokIter iterator)
+struct Token {
+    const char *start;
+    size_t length;
+};
+
+/// The next token; of length 0, at the place where the search ended, when there is none.
+Token nextToken(ZlvStrTokIter iterator)
 {
     if (iterator.position == nullptr || *iterator.position == '\0')
         return {iterator.position, 0};
@@ -20,12 +24,12 @@ std::string_view nextToken(ZlvStrTokIter iterator)
     return {start, std::strcspn(start, iterator.delimiters)};
 }
 
-char *copyOf(std::string_view token)
+char *copyOf(Token token)
 {
-    auto *copy = static_cast<char *>(RkoMemoryMalloc(token.size() + 1));
+    auto *copy = static_cast<char *>(RkoMemoryMalloc(token.length + 1));
     if (copy != nullptr) {
-        std::memcpy(copy, token.data(), token.size());
-        copy[token.size()] = '\0';
+        std::memcpy(copy, token.start, token.length);
+        copy[token.length] = '\0';
     }
     return copy;
 }
@@ -40,19 +44,19 @@ void ZlvStrTokIterator(ZlvStrTokIter *out, const char *string, const char *delim
 
 ZlvBool ZlvStrTokIterHasNext(ZlvStrTokIter iterator)
 {
-    return nextToken(iterator).empty() ? 0 : 1;
+    return nextToken(iterator).length > 0 ? 1 : 0;
 }
 
 char *ZlvStrTokIterGet(ZlvStrTokIter iterator)
 {
-    const std::string_view token = nextToken(iterator);
-    return token.empty() ? nullptr : copyOf(token);
+    const Token token = nextToken(iterator);
+    return token.length > 0 ? copyOf(token) : nullptr;
 }
 
 ZlvStrTokIter ZlvStrTokIterNext(ZlvStrTokIter *out, ZlvStrTokIter iterator)
 {
-    const std::string_view token = nextToken(iterator);
-    const ZlvStrTokIter next{token.data() + token.size(), iterator.delimiters};
+    const Token token = nextToken(iterator);
+    const ZlvStrTokIter next{token.start + token.length, iterator.delimiters};
     if (out != nullptr)
         *out = next;
     return next;
