@@ -6,7 +6,7 @@
 #include "ZlvLogManager.h"
 
 #include "CxMemory.h"
-#include "CxOwned.h"
+#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvCfgChain.h"

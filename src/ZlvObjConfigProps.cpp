@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Properties of configurations: own ones are set, inherited ones are read.
-#include "CxOwned.h"
+#include "util/CxOwned.h"
 #include "ZlvApiMutex.h"
 #include "ZlvCfgChain.h"
 #include "ZlvProps.h"

@@ -9,7 +9,7 @@
 #include <utility>
 
 #include "CxMemory.h"
-#include "CxOwned.h"
+#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvDeferredFree.h"

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Properties of objects: stored as text, and each change told to the object's class.
-#include "CxOwned.h"
+#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvObjectIntl.h"
