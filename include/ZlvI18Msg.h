@@ -65,8 +65,8 @@ ZLV_API void ZlvFreeI18Msg(ZlvI18Msg *message);
  * @param message  the message; null gives null
  * @param args     the pattern's arguments in order; the list is only copied, never advanced, and
  *                 not touched at all for a pattern without '{'. Where a null list can be expressed
- *                 it stands for zeros; a pattern with more than 64 arguments then fails with
- *                 U_ILLEGAL_ARGUMENT_ERROR
+ *                 it stands for zeros: ICU refuses a pattern that asks it for a text, and one with
+ *                 an argument number above 63 fails with U_ILLEGAL_ARGUMENT_ERROR
  * @return the text, which the caller frees with RkoMemoryFree(); null when there is none
  * @lock takes the API mutex
  */

@@ -99,7 +99,7 @@ ZLV_API char *ZlvGetObjectName(ZlvObject *object);
 
 /**
  * Binds the description of an object's class to text, in the default locale. A description with
- * placeholders is bound with zeros and empty texts.
+ * placeholders is bound with zeros; one that asks for a text cannot be bound.
  *
  * @param object  null gives null
  * @return new text, freed by the caller with RkoMemoryFree(); null when the class has no

@@ -57,7 +57,10 @@ ZlvI18Msg *zlvIntlCopyI18Msg(const ZlvI18Msg *message)
     copy->parameters = zlvIntlCopyParmList(message->parameters);
     copy->locale = message->locale;
     copy->icuError = message->icuError;
-    return copy;
+    if (copy->parameters != nullptr || message->parameters == nullptr)
+        return copy;
+    zlvIntlFreeI18Msg(copy);
+    return nullptr;
 }
 
 ZlvI18Msg *ZlvCopyI18Msg(const ZlvI18Msg *message)
