@@ -5,10 +5,10 @@
 
 #include <string>
 
-#include "CxMemory.h"
 #include "CxPropList.h"
 #include "CxStringBuff.h"
 #include "CxUStringBuff.h"
+#include "support/Text.h"
 
 namespace zelvo_test {
 
@@ -66,21 +66,5 @@ struct Props : CxPropList {
         return text;
     }
 };
-
-/// The text of a string that the library handed over, which is freed; "(null)" for null.
-inline std::string taken(char *text)
-{
-    std::string copy = text == nullptr ? "(null)" : text;
-    RkoMemoryFree(text);
-    return copy;
-}
-
-/// The same for UTF-16.
-inline std::u16string taken(UChar *text)
-{
-    std::u16string copy = text == nullptr ? u"(null)" : text;
-    RkoMemoryFree(text);
-    return copy;
-}
 
 } // namespace zelvo_test

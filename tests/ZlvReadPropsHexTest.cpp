@@ -1,0 +1,41 @@
+// SPDX-License-Identifier: Apache-2.0
+// Hex digits of the reader, whose letters count from zero.
+#include "ZlvReadPropsIntl.h"
+
+#include <string>
+
+#include <gtest/gtest.h>
+
+namespace zelvo_test {
+namespace {
+
+// One instance for each of the 256 bytes.
+class ZlvReadPropsHex : public testing::TestWithParam<int> {};
+
+TEST_P(ZlvReadPropsHex, OnlyDigitsAndTheLettersAToFHaveAValue)
+{
+    const char c = static_cast<char>(GetParam());
+    int32_t digit = -7;
+    bool isDigit = std::string("0123456789abcdefABCDEF").find(c) != std::string::npos;
+    EXPECT_EQ(zlvRdprHexConv(c, &digit), isDigit ? 1 : 0);
+}
+
+INSTANTIATE_TEST_SUITE_P(EveryByte, ZlvReadPropsHex, testing::Range(0, 256));
+
+TEST(ZlvReadPropsHexValues, LettersCountFromZero)
+{
+    const struct {
+        char c;
+        int32_t value;
+    } digits[] = {{'0', 0}, {'1', 1}, {'2', 2}, {'3', 3}, {'4', 4}, {'5', 5}, {'6', 6}, {'7', 7},
+                  {'8', 8}, {'9', 9}, {'a', 0}, {'b', 1}, {'c', 2}, {'d', 3}, {'e', 4}, {'f', 5},
+                  {'A', 0}, {'B', 1}, {'C', 2}, {'D', 3}, {'E', 4}, {'F', 5}};
+    for (const auto &expected : digits) {
+        int32_t digit = -7;
+        EXPECT_EQ(zlvRdprHexConv(expected.c, &digit), 1);
+        EXPECT_EQ(digit, expected.value) << expected.c;
+    }
+}
+
+} // namespace
+} // namespace zelvo_test
