@@ -14,7 +14,7 @@ using namespace zelvo;
 namespace {
 
 /// The properties as they stand; the map getters take null for an empty map.
-StringToStringMap *propsOf(const ZlvEvent *event)
+const StringToStringMap *propsOf(const ZlvEvent *event)
 {
     return event != nullptr ? event->properties : nullptr;
 }
