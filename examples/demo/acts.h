@@ -1,0 +1,15 @@
+// SPDX-License-Identifier: Apache-2.0
+// The acts of the demo, one file each, and the headings that tell their story.
+#ifndef DEMO_ACTS_H
+#define DEMO_ACTS_H
+
+/// Prints the heading of the next act.
+void act(const char *title);
+
+/// Prints the heading of a scene and what to look for in it.
+void scene(const char *title, const char *explanation);
+
+/// One tree of objects that logs in several languages and changes while it runs (tree.c).
+void showTree(void);
+
+#endif

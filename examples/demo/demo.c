@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+// The demo: what zelvo does, told in acts. Start it with `./run demo`.
+//
+// Read main() first, then tree.c. The objects that the acts speak of are not made here: the
+// properties file demo.properties describes them.
+#include <locale.h>
+#include <stdio.h>
+
+#include "acts.h"
+#include "zelvo.h"
+
+/// Says why the toolkit did not open.
+static int refuse(CxStatus error)
+{
+    const char *reason = ZlvGetPlatformErrStr(error.type, error.code);
+    fprintf(stderr, "%s: %s\n", DEMO_PROPERTIES, reason ? reason : "malformed line");
+    return 1;
+}
+
+int main(void)
+{
+    setlocale(LC_ALL, ""); // text is printed in the code page of the user's locale
+
+    CxStatus error = {CX_STATUS_OK, 0};
+    if (!ZlvOpenToolkit(DEMO_PROPERTIES, &error))
+        return refuse(error);
+
+    act("one tree, seven levels, three languages");
+    showTree();
+
+    ZlvCloseToolkit(); // frees every object, configuration and class
+    return 0;
+}
