@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvDeferredFree.h"
 
+#include <type_traits>
+
 #include "CxMemory.h"
 #include "ZlvObject.h"
 
