@@ -35,7 +35,10 @@ static void change(const char *object, const char *property, const char *value)
 
 void showTree(void)
 {
+    // An object lives while somebody holds it: another object that it belongs to, or the program.
+    // The program holds the filter too, so that it keeps its changes while nobody listens to it.
     ZlvObject *log = ZlvGetObject("shop.log", NULL);
+    ZlvObject *filter = ZlvGetObject("filter.worries", NULL);
 
     scene("Seven calls, two consoles",
           "The English console takes all seven records. The German one stands behind a filter\n"
@@ -57,5 +60,6 @@ void showTree(void)
     change("shop.log", "listenerNames", "filter.worries");
     openShop(log);
 
+    ZlvReleaseObject(filter);
     ZlvReleaseObject(log);
 }
