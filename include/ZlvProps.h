@@ -23,7 +23,7 @@ CX_BEGIN_DECLS
  * @return a copy, which the caller frees with RkoMemoryFree(); null when not found
  * @lock none
  */
-ZLV_API char *ZlvGetMapProp(const StringToStringMap *map, const char *property, ZlvBool *found);
+ZLV_API char *ZlvGetMapProp(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads a property as a truth value: "true" or "false" in any case of letters.
@@ -34,8 +34,7 @@ ZLV_API char *ZlvGetMapProp(const StringToStringMap *map, const char *property, 
  * @return 1 for "true", else 0
  * @lock none
  */
-ZLV_API ZlvBool ZlvGetMapPropBool(const StringToStringMap *map, const char *property,
-                                  ZlvBool *found);
+ZLV_API ZlvBool ZlvGetMapPropBool(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads the first byte of a property.
@@ -46,7 +45,7 @@ ZLV_API ZlvBool ZlvGetMapPropBool(const StringToStringMap *map, const char *prop
  * @return the byte; 0 for the empty text and when not found
  * @lock none
  */
-ZLV_API char ZlvGetMapPropChar(const StringToStringMap *map, const char *property, ZlvBool *found);
+ZLV_API char ZlvGetMapPropChar(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads a property as a decimal number. Leading blanks and what follows the number are ignored. A
@@ -59,8 +58,7 @@ ZLV_API char ZlvGetMapPropChar(const StringToStringMap *map, const char *propert
  * @return the number; 0 when not found
  * @lock none
  */
-ZLV_API int32_t ZlvGetMapPropInt(const StringToStringMap *map, const char *property,
-                                 ZlvBool *found);
+ZLV_API int32_t ZlvGetMapPropInt(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads a property as a decimal number of 64 bits. Leading blanks and what follows the number are
@@ -72,8 +70,7 @@ ZLV_API int32_t ZlvGetMapPropInt(const StringToStringMap *map, const char *prope
  * @return the number; 0 when not found
  * @lock none
  */
-ZLV_API int64_t ZlvGetMapPropLong(const StringToStringMap *map, const char *property,
-                                  ZlvBool *found);
+ZLV_API int64_t ZlvGetMapPropLong(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads a property as a floating number, as sscanf() does with "%f". Leading blanks and what
@@ -85,8 +82,7 @@ ZLV_API int64_t ZlvGetMapPropLong(const StringToStringMap *map, const char *prop
  * @return the number; 0 when not found
  * @lock none
  */
-ZLV_API float ZlvGetMapPropFloat(const StringToStringMap *map, const char *property,
-                                 ZlvBool *found);
+ZLV_API float ZlvGetMapPropFloat(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Reads a property as a floating number of double precision, as sscanf() does with "%lf". Leading
@@ -98,8 +94,7 @@ ZLV_API float ZlvGetMapPropFloat(const StringToStringMap *map, const char *prope
  * @return the number; 0 when not found
  * @lock none
  */
-ZLV_API double ZlvGetMapPropDouble(const StringToStringMap *map, const char *property,
-                                   ZlvBool *found);
+ZLV_API double ZlvGetMapPropDouble(StringToStringMap *map, const char *property, ZlvBool *found);
 
 /**
  * Stores a text.

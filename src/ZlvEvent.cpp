@@ -14,7 +14,7 @@ using namespace zelvo;
 namespace {
 
 /// The properties as they stand; the map getters take null for an empty map.
-const StringToStringMap *propsOf(const ZlvEvent *event)
+StringToStringMap *propsOf(const ZlvEvent *event)
 {
     return event != nullptr ? event->properties : nullptr;
 }

@@ -6,11 +6,11 @@
 #include "ZlvLogManager.h"
 
 #include "CxMemory.h"
-#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvCfgChain.h"
 #include "ZlvToolkitIntl.h"
+#include "util/CxOwned.h"
 
 StringGroup *ZLV_TK_CFG_NAMES = nullptr;
 StringToObjCfgMap *ZLV_TK_CFG_DATA = nullptr;

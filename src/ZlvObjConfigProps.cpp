@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Properties of configurations: own ones are set, inherited ones are read.
-#include "util/CxOwned.h"
 #include "ZlvApiMutex.h"
 #include "ZlvCfgChain.h"
 #include "ZlvProps.h"
 #include "ZlvPropsIntl.h"
+#include "util/CxOwned.h"
 
 namespace {
 

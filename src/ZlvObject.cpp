@@ -9,7 +9,6 @@
 #include <utility>
 
 #include "CxMemory.h"
-#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvDeferredFree.h"
@@ -17,6 +16,7 @@
 #include "ZlvObjectIntl.h"
 #include "ZlvRelaxed.h"
 #include "ZlvToolkitIntl.h"
+#include "util/CxOwned.h"
 
 namespace {
 

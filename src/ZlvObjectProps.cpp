@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 // Properties of objects: stored as text, and each change told to the object's class.
-#include "util/CxOwned.h"
 #include "CxString.h"
 #include "ZlvApiMutex.h"
 #include "ZlvObjectIntl.h"
 #include "ZlvProps.h"
 #include "ZlvRelaxed.h"
 #include "ZlvStrTok.h"
+#include "util/CxOwned.h"
 
 namespace {
 

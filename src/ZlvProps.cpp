@@ -32,7 +32,7 @@ Value scan(const char *text, const char *format, ZlvBool *found)
 }
 
 template <class Value>
-Value getConverted(const StringToStringMap *map, const char *property, ZlvBool *found,
+Value getConverted(StringToStringMap *map, const char *property, ZlvBool *found,
                    Value (*convert)(const char *, ZlvBool *))
 {
     OwnedStr text{zlvIntlStringToStringMapGet(map, property)};
@@ -85,39 +85,39 @@ double zlvPropStrToFloat64(const char *text, ZlvBool *found)
     return scan<double>(text, "%lf", found);
 }
 
-char *ZlvGetMapProp(const StringToStringMap *map, const char *property, ZlvBool *found)
+char *ZlvGetMapProp(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     char *value = zlvIntlStringToStringMapGet(map, property);
     tell(found, value != nullptr);
     return value;
 }
 
-ZlvBool ZlvGetMapPropBool(const StringToStringMap *map, const char *property, ZlvBool *found)
+ZlvBool ZlvGetMapPropBool(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToBool);
 }
 
-char ZlvGetMapPropChar(const StringToStringMap *map, const char *property, ZlvBool *found)
+char ZlvGetMapPropChar(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToChar);
 }
 
-int32_t ZlvGetMapPropInt(const StringToStringMap *map, const char *property, ZlvBool *found)
+int32_t ZlvGetMapPropInt(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToInt32);
 }
 
-int64_t ZlvGetMapPropLong(const StringToStringMap *map, const char *property, ZlvBool *found)
+int64_t ZlvGetMapPropLong(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToInt64);
 }
 
-float ZlvGetMapPropFloat(const StringToStringMap *map, const char *property, ZlvBool *found)
+float ZlvGetMapPropFloat(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToFloat32);
 }
 
-double ZlvGetMapPropDouble(const StringToStringMap *map, const char *property, ZlvBool *found)
+double ZlvGetMapPropDouble(StringToStringMap *map, const char *property, ZlvBool *found)
 {
     return getConverted(map, property, found, zlvPropStrToFloat64);
 }

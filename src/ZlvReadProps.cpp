@@ -110,3 +110,9 @@ ZlvBool zlvDoReadProps(const char *path, CxPropList *target, CxStatus *error)
     failed(CxFileClose(&input.file), error);
     return state == ZLV_RDPR_DONE;
 }
+
+// Stands here and not with the list, which knows nothing of the reader above it.
+ZlvBool CxPropListRead(const char *fileName, CxPropList *list, CxStatus *error)
+{
+    return list != nullptr ? zlvDoReadProps(fileName, list, error) : ZlvBool{0};
+}

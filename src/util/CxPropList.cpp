@@ -9,7 +9,6 @@
 #include "CxMemory.h"
 #include "CxOwned.h"
 #include "CxString.h"
-#include "ZlvIntl.h"
 
 static constexpr int32_t FIRST_CAPACITY = 32;
 
@@ -51,11 +50,6 @@ static CxPropListEntry *appendEmptyEntry(CxPropList *list)
     CxPropListEntry *entry = &list->entries[list->count++];
     *entry = {};
     return entry;
-}
-
-ZlvBool CxPropListRead(const char *fileName, CxPropList *list, CxStatus *error)
-{
-    return list != nullptr && zlvDoReadProps(fileName, list, error);
 }
 
 ZlvBool CxPropListPutStr(CxPropList *list, const char *key, const char *value)
