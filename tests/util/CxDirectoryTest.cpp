@@ -66,6 +66,14 @@ TEST_F(CxDirectoryTest, OpenRefusesNullArguments)
     EXPECT_EQ(directory, nullptr);
 }
 
+TEST_F(CxDirectoryTest, AFailedOpenLeavesNullInTheSlot)
+{
+    int other = 0;
+    CxDirectory slot = &other;
+    EXPECT_TRUE(failedWith(CxDirectoryOpen(&slot, "dir/one"), EINVAL));
+    EXPECT_EQ(slot, nullptr);
+}
+
 TEST_F(CxDirectoryTest, OpenRefusesARegularFile)
 {
     EXPECT_TRUE(failedWith(CxDirectoryOpen(&directory, "dir/one"), EINVAL));

@@ -316,7 +316,7 @@ TEST(CxString, StrpbrkFindsTheFirstByteOfTheSet)
 {
     const char *text = "key = value";
     EXPECT_EQ(RkoStringStrpbrk(text, "=: "), text + 3);
-    EXPECT_EQ(RkoStringStrpbrk(text, "xyz"), nullptr);
+    EXPECT_EQ(RkoStringStrpbrk(text, "?!"), nullptr);
 }
 
 TEST(CxString, StrpbrkWithANullArgumentIsNull)

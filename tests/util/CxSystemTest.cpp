@@ -61,8 +61,8 @@ class CxSystemHostname : public testing::Test {
 protected:
     void host(const std::string &name, const char *official)
     {
-        system.gethostname = [name](char *buffer, size_t size) {
-            std::strncpy(buffer, name.c_str(), size);
+        system.gethostname = [name](char *own, size_t size) {
+            std::strncpy(own, name.c_str(), size);
             return 0;
         };
         if (official != nullptr)
@@ -118,8 +118,7 @@ TEST_F(CxSystemHostname, AnOfficialNameIsCutAtTheSizeWithoutATerminator)
     host("node", "node.example.org");
     std::memset(buffer, 'x', 16);
     EXPECT_TRUE(succeeded(CxSystemGetFQHostname(buffer, 10)));
-    EXPECT_EQ(std::string(buffer, 12), "node.examp"
-                                       "xx");
+    EXPECT_EQ(std::string(buffer, 12), "node.exampxx");
 }
 
 TEST_F(CxSystemHostname, AnUnknownOwnNameIsAFailureWithAFixedNumber)
