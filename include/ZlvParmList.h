@@ -97,7 +97,8 @@ ZLV_API ParmListIterator zlvIntlParmListIterNext(ParmListIterator iterator);
  * Hands out the element that the walk stands on.
  *
  * @param iterator  where the walk stands
- * @return a copy, which the caller frees with ZlvFreeParm(); null for a null iterator
+ * @return a copy, freed by the caller with ZlvFreeParm(), if there is memory for it; null for a
+ *         null iterator
  * @lock takes the API mutex
  */
 ZLV_API ZlvParm *ZlvParmListIterGet(ParmListIterator iterator);
@@ -129,7 +130,7 @@ ZLV_API ParmListNode *ZlvParmListGetLink(const ParmList *list, const ZlvParm *el
 
 /**
  * Makes a list with the same elements in the same order, each taken in anew as ZlvParmListAppend()
- * does. An element that cannot be is skipped.
+ * does. An element that finds no memory is skipped.
  *
  * @param list  null gives null
  * @return the new list, which the caller frees with ZlvFreeParmList(); null when memory ran out

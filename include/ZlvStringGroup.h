@@ -94,7 +94,8 @@ ZLV_API StringGroupIterator zlvIntlStringGroupIterNext(StringGroupIterator itera
  * Hands out the element that the walk stands on.
  *
  * @param iterator  where the walk stands
- * @return a copy, which the caller frees with RkoMemoryFree(); null for a null iterator
+ * @return a copy, freed by the caller with RkoMemoryFree(), if there is memory for it; null for a
+ *         null iterator
  * @lock takes the API mutex
  */
 ZLV_API char *ZlvStringGroupIterGet(StringGroupIterator iterator);

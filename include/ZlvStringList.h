@@ -96,7 +96,8 @@ ZLV_API StringListIterator zlvIntlStringListIterNext(StringListIterator iterator
  * Hands out the element that the walk stands on.
  *
  * @param iterator  where the walk stands
- * @return a copy, which the caller frees with RkoMemoryFree(); null for a null iterator
+ * @return a copy, freed by the caller with RkoMemoryFree(), if there is memory for it; null for a
+ *         null iterator
  * @lock takes the API mutex
  */
 ZLV_API char *ZlvStringListIterGet(StringListIterator iterator);
@@ -128,7 +129,7 @@ ZLV_API StringListNode *ZlvStringListGetLink(const StringList *list, const char 
 
 /**
  * Makes a list with the same elements in the same order, each taken in anew as
- * ZlvStringListAppend() does. An element that cannot be is skipped.
+ * ZlvStringListAppend() does. An element that finds no memory is skipped.
  *
  * @param list  null gives null
  * @return the new list, which the caller frees with ZlvFreeStringList(); null when memory ran out

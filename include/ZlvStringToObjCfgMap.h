@@ -38,9 +38,9 @@ struct StringToObjCfgMap {
 struct StringToObjCfgMapNode {
     StringToObjCfgMapNode *next; /**< the newer neighbour; null at the end */
     StringToObjCfgMapNode *prev; /**< the older neighbour; null at the start */
-    char *key;                   /**< owned by the map; null if it could not be copied */
-    ZlvObjCfg *value;            /**< held by the map; may be null */
-    StringToObjCfgMap *map;      /**< the map that holds the node */
+    char *key; /**< owned by the map; null if it could not be copied or the node is removed */
+    ZlvObjCfg *value;       /**< held by the map; may be null */
+    StringToObjCfgMap *map; /**< the map that holds the node */
 };
 
 /**
@@ -122,8 +122,8 @@ ZLV_API ZlvObjCfg *ZlvStringToObjCfgMapIterGetVal(StringToObjCfgMapIterator iter
 ZLV_API ZlvObjCfg *zlvIntlStringToObjCfgMapIterGetVal(StringToObjCfgMapIterator iterator);
 
 /**
- * Makes a map with the same entries in the same order, each put anew. An entry that cannot be is
- * skipped.
+ * Makes a map with the same entries in the same order, each put anew. An entry that finds no memory
+ * is skipped.
  *
  * @param map  null gives null
  * @return the new map, which the caller frees with ZlvFreeStringToObjCfgMap(); null when memory ran

@@ -35,9 +35,9 @@ struct StringToObjClassMap {
 struct StringToObjClassMapNode {
     StringToObjClassMapNode *next; /**< the newer neighbour; null at the end */
     StringToObjClassMapNode *prev; /**< the older neighbour; null at the start */
-    char *key;                     /**< owned by the map; null if it could not be copied */
-    ZlvObjClass *value;            /**< held by the map; may be null */
-    StringToObjClassMap *map;      /**< the map that holds the node */
+    char *key; /**< owned by the map; null if it could not be copied or the node is removed */
+    ZlvObjClass *value;       /**< held by the map; may be null */
+    StringToObjClassMap *map; /**< the map that holds the node */
 };
 
 /**
@@ -122,8 +122,8 @@ ZLV_API ZlvObjClass *ZlvStringToObjClassMapIterGetVal(StringToObjClassMapIterato
 ZLV_API ZlvObjClass *zlvIntlStringToObjClassMapIterGetVal(StringToObjClassMapIterator iterator);
 
 /**
- * Makes a map with the same entries in the same order, each put anew. An entry that cannot be is
- * skipped.
+ * Makes a map with the same entries in the same order, each put anew. An entry that finds no memory
+ * is skipped.
  *
  * @param map  null gives null
  * @return the new map, which the caller frees with ZlvFreeStringToObjClassMap(); null when memory

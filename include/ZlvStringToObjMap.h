@@ -37,9 +37,9 @@ struct StringToObjMap {
 struct StringToObjMapNode {
     StringToObjMapNode *next; /**< the newer neighbour; null at the end */
     StringToObjMapNode *prev; /**< the older neighbour; null at the start */
-    char *key;                /**< owned by the map; null if it could not be copied */
-    ZlvObject *value;         /**< held by the map; may be null */
-    StringToObjMap *map;      /**< the map that holds the node */
+    char *key; /**< owned by the map; null if it could not be copied or the node is removed */
+    ZlvObject *value;    /**< held by the map; may be null */
+    StringToObjMap *map; /**< the map that holds the node */
 };
 
 /**
@@ -120,8 +120,8 @@ ZLV_API ZlvObject *ZlvStringToObjMapIterGetVal(StringToObjMapIterator iterator);
 ZLV_API ZlvObject *zlvIntlStringToObjMapIterGetVal(StringToObjMapIterator iterator);
 
 /**
- * Makes a map with the same entries in the same order, each put anew. An entry that cannot be is
- * skipped.
+ * Makes a map with the same entries in the same order, each put anew. An entry that finds no memory
+ * is skipped.
  *
  * @param map  null gives null
  * @return the new map, which the caller frees with ZlvFreeStringToObjMap(); null when memory ran

@@ -35,9 +35,9 @@ struct StringToStringMap {
 struct StringToStringMapNode {
     StringToStringMapNode *next; /**< the newer neighbour; null at the end */
     StringToStringMapNode *prev; /**< the older neighbour; null at the start */
-    char *key;                   /**< owned by the map; null if it could not be copied */
-    char *value;                 /**< held by the map; may be null */
-    StringToStringMap *map;      /**< the map that holds the node */
+    char *key;   /**< owned by the map; null if it could not be copied or the node is removed */
+    char *value; /**< held by the map; may be null */
+    StringToStringMap *map; /**< the map that holds the node */
 };
 
 /**
@@ -110,8 +110,8 @@ ZLV_API char *zlvIntlStringToStringMapIterGetKey(StringToStringMapIterator itera
  * Hands out the value of the entry that the walk stands on.
  *
  * @param iterator  where the walk stands
- * @return a copy, which the caller frees with RkoMemoryFree(); null for a null iterator or a null
- *         value
+ * @return a copy, freed by the caller with RkoMemoryFree(), if there is memory for it; null for a
+ *         null iterator or a null value
  * @lock takes the API mutex
  */
 ZLV_API char *ZlvStringToStringMapIterGetVal(StringToStringMapIterator iterator);
@@ -119,8 +119,8 @@ ZLV_API char *ZlvStringToStringMapIterGetVal(StringToStringMapIterator iterator)
 ZLV_API char *zlvIntlStringToStringMapIterGetVal(StringToStringMapIterator iterator);
 
 /**
- * Makes a map with the same entries in the same order, each put anew. An entry that cannot be is
- * skipped.
+ * Makes a map with the same entries in the same order, each put anew. An entry that finds no memory
+ * is skipped.
  *
  * @param map  null gives null
  * @return the new map, which the caller frees with ZlvFreeStringToStringMap(); null when memory ran
@@ -152,8 +152,8 @@ ZLV_API ZlvBool zlvIntlStringToStringMapPut(StringToStringMap *map, const char *
  *
  * @param map  null is searched like an empty map
  * @param key  compared exactly; null matches nothing
- * @return a copy, which the caller frees with RkoMemoryFree(); null when there is no such key or
- *         the value is null
+ * @return a copy, freed by the caller with RkoMemoryFree(), if there is memory for it; null when
+ *         there is no such key or the value is null
  * @lock takes the API mutex
  */
 ZLV_API char *ZlvStringToStringMapGet(const StringToStringMap *map, const char *key);

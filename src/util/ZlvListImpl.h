@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdlib>
+#include <type_traits>
 
 #include "ZlvLinksImpl.h"
 
@@ -13,7 +14,8 @@ namespace zelvo {
 template <class Element, class List>
 [[gnu::noinline]] Element *zlvSortScratch(const List *list)
 {
-    auto *array = static_cast<Element *>(RkoMemoryMalloc(list->count * sizeof(Element)));
+    static_assert(std::is_pointer_v<Element>);
+    auto *array = static_cast<Element *>(RkoMemoryMalloc(list->count * sizeof(void *)));
     if (array == nullptr)
         return nullptr;
     Element *slot = array;
