@@ -23,7 +23,7 @@ void setAndNotify(ZlvObject *object, const char *property, Setter set, Value val
 /// Reads a value with the getter of its type.
 template <class Value>
 Value get(ZlvObject *object, const char *property, ZlvBool *found,
-          Value (*getter)(const StringToStringMap *, const char *, ZlvBool *))
+          Value (*getter)(StringToStringMap *, const char *, ZlvBool *))
 {
     return getter(object != nullptr ? object->properties : nullptr, property, found);
 }
