@@ -3,6 +3,7 @@
 #include <stdio.h>
 #include <string.h>
 
+#include "CxMemory.h"
 #include "ZlvI18Msg.h"
 #include "ZlvIntl.h"
 #include "ZlvLogger.h"
