@@ -3,7 +3,6 @@
 // checks that nothing is left.
 #pragma once
 
-
 #include <functional>
 #include <iterator>
 #include <vector>
