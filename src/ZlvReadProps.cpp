@@ -84,10 +84,13 @@ int32_t run(Input &input, Context &context, CxStatus *error)
 {
     int32_t state = ZLV_RDPR_START_LINE;
     for (char current = '\0'; state < ZLV_RDPR_DONE; ++input.next) {
-        if (input.next == input.count && failed(fill(input), error))
-            return ZLV_RDPR_ERROR;
-        if (input.count == 0)
-            return finish(context);
+        if (input.next == input.count) {
+            const CxStatus status = fill(input);
+            if (input.count == 0)
+                return finish(context);
+            if (failed(status, error))
+                return ZLV_RDPR_ERROR;
+        }
         const char previous = current;
         current = input.bytes[input.next];
         state = handle(state, previous, current, context);

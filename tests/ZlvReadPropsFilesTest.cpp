@@ -51,10 +51,33 @@ TEST_F(ZlvReadPropsFiles, AFailingReadEndsTheReadEvenWithAnEntryPending)
 TEST_F(ZlvReadPropsFiles, AFailingReadThatGaveAByteFailsAsWell)
 {
     FileFaults faults;
-    faults.failReadsWithAByte(4, EIO);
+    faults.failReads(4, EIO, 1);
     EXPECT_FALSE(reads("a=1\nb=2\n"));
     EXPECT_TRUE(errorIs('p', EIO));
     EXPECT_EQ(faults.reports, 1U);
+}
+
+TEST_F(ZlvReadPropsFiles, AReadOfNoByteIsTheEndOfInputEvenWhenItFails)
+{
+    FileFaults faults;
+    faults.failReads(7, EIO, 0);
+    EXPECT_TRUE(reads("a=1\nb=2\nc=3\n"));
+    EXPECT_EQ(list.all(), "a=1 b=2");
+    EXPECT_TRUE(errorUntouched());
+    EXPECT_EQ(faults.reports, 0U);
+}
+
+TEST_F(ZlvReadPropsFiles, AReadMayFailAnywhereInTheFile)
+{
+    const std::string text = "a=one\\\r\n  two\r\n# c\r\nb=\\u0041\n";
+    for (size_t bytes = 1; bytes < text.size(); ++bytes) {
+        FileFaults faults;
+        faults.failReads(bytes, EIO);
+        EXPECT_FALSE(reads(text)) << bytes;
+        EXPECT_EQ(faults.reports, 1U);
+    }
+    EXPECT_TRUE(reads(text));
+    EXPECT_EQ(list.all(), "a=onetwo b=A");
 }
 
 TEST_F(ZlvReadPropsFiles, AFailingCloseIsCopiedWithoutChangingTheResult)

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "support/FileFaults.h"
 
+#include <algorithm>
+
 #include "CxFile.h"
 #include "ZlvMisc.h"
 
@@ -19,16 +21,11 @@ FileFaults::~FileFaults()
     faults = nullptr;
 }
 
-void FileFaults::failReads(uint32_t allowed, int32_t code)
+void FileFaults::failReads(size_t bytes, int32_t code, size_t count)
 {
-    allowedReads = allowed;
+    readableBytes = bytes;
     readCode = code;
-}
-
-void FileFaults::failReadsWithAByte(uint32_t allowed, int32_t code)
-{
-    failReads(allowed, code);
-    failedReadHasByte = true;
+    failedReadCount = count;
 }
 
 void FileFaults::failCloses(int32_t code)
@@ -39,14 +36,6 @@ void FileFaults::failCloses(int32_t code)
 FileFaults *FileFaults::current()
 {
     return faults;
-}
-
-bool FileFaults::strikesRead()
-{
-    if (allowedReads == 0)
-        return true;
-    --allowedReads;
-    return false;
 }
 
 } // namespace zelvo_test
@@ -66,10 +55,17 @@ const char *__wrap_ZlvReportPlatformErr(char type, int32_t code);
 CxStatus __wrap_CxFileRead(CxFile *file, void *buffer, size_t length, size_t *count)
 {
     FileFaults *faults = FileFaults::current();
-    if (faults == nullptr || !faults->strikesRead())
+    if (faults == nullptr)
         return __real_CxFileRead(file, buffer, length, count);
-    *count = faults->failedReadHasByte ? 1 : SIZE_MAX;
-    return CxStatus{CX_STATUS_PLATFORM, faults->readCode};
+    if (faults->readableBytes == 0) {
+        *count = faults->failedReadCount;
+        return CxStatus{CX_STATUS_PLATFORM, faults->readCode};
+    }
+    CxStatus status =
+        __real_CxFileRead(file, buffer, std::min(length, faults->readableBytes), count);
+    if (status.type == CX_STATUS_OK)
+        faults->readableBytes -= *count;
+    return status;
 }
 
 CxStatus __wrap_CxFileClose(CxFile *file)

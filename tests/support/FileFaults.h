@@ -3,6 +3,7 @@
 // hook. As with FailAlloc.h, the linker sends the calls that cross a source file here first.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 
 #include "CxTypes.h"
@@ -17,10 +18,9 @@ public:
     FileFaults &operator=(const FileFaults &) = delete;
     ~FileFaults();
 
-    /// Fails every read after ALLOWED good ones, with the error number CODE.
-    void failReads(uint32_t allowed, int32_t code);
-    /// A failing read says that it read one byte, so that it does not look like the end of input.
-    void failReadsWithAByte(uint32_t allowed, int32_t code);
+    /// Lets BYTES bytes of all files be read, then fails every read with the error number CODE. A
+    /// failing read gives COUNT as its number of bytes, by default the one that real failures give.
+    void failReads(size_t bytes, int32_t code, size_t count = SIZE_MAX);
     /// Reports CODE for every close; the file is closed all the same.
     void failCloses(int32_t code);
 
@@ -31,12 +31,11 @@ public:
     /// The faults of this thread; null when there are none.
     static FileFaults *current();
 
-    /// Used by the interposed functions.
-    bool strikesRead();
-    uint32_t allowedReads = UINT32_MAX;
+    /// Read by the interposed functions.
+    size_t readableBytes = SIZE_MAX;
+    size_t failedReadCount = SIZE_MAX;
     int32_t readCode = 0;
     int32_t closeCode = 0;
-    bool failedReadHasByte = false;
 };
 
 } // namespace zelvo_test

@@ -10,7 +10,8 @@
 
 namespace zelvo_test {
 
-/// While one lives, bytes are converted by the converter named.
+/// While one lives, bytes are converted by the converter named. Builds of the Unicode library whose
+/// default is always UTF-8 know no other, so tests ask for that one.
 class DefaultConverter {
 public:
     explicit DefaultConverter(const char *name) : before_(ucnv_getDefaultName())

@@ -93,12 +93,20 @@ TEST(CxUStringBuff, AppendsAreJoined)
 
 TEST(CxUStringBuff, BytesAreConvertedByTheDefaultConverter)
 {
-    DefaultConverter latin("ISO-8859-1");
+    DefaultConverter utf8("UTF-8");
     UBuff buff;
-    EXPECT_EQ(CxUStringBuffAppendStr(&buff, "\xE9"), 1);
-    EXPECT_EQ(CxUStringBuffAppendStrN(&buff, "\xE8!", 1), 1);
-    EXPECT_EQ(CxUStringBuffAppendChar(&buff, '\xE7'), 1);
-    EXPECT_EQ(buff.text(), u"\u00E9\u00E8\u00E7");
+    EXPECT_EQ(CxUStringBuffAppendStr(&buff, "\xC3\xA9"), 1);
+    EXPECT_EQ(CxUStringBuffAppendStrN(&buff, "\xC3\xA8!", 2), 1);
+    EXPECT_EQ(buff.text(), u"\u00E9\u00E8");
+}
+
+TEST(CxUStringBuff, AByteIsConvertedOnItsOwn)
+{
+    DefaultConverter utf8("UTF-8");
+    UBuff buff;
+    EXPECT_EQ(CxUStringBuffAppendChar(&buff, '\xC3'), 1);
+    EXPECT_EQ(CxUStringBuffAppendChar(&buff, '\xA9'), 1);
+    EXPECT_EQ(buff.text(), u"\uFFFD\uFFFD");
 }
 
 TEST(CxUStringBuff, TheLengthCountsUnitsAndNotBytes)
