@@ -1,0 +1,38 @@
+# SPDX-License-Identifier: Apache-2.0
+# Runs every example, and compares the documentation with them.
+find_package(Python3 REQUIRED COMPONENTS Interpreter)
+set(examples ${PROJECT_SOURCE_DIR}/examples)
+
+function(zelvo_script_test name script)
+    add_test(NAME ${name}
+        COMMAND ${Python3_EXECUTABLE} ${CMAKE_CURRENT_SOURCE_DIR}/${script} ${ARGN})
+    set_tests_properties(${name} PROPERTIES ENVIRONMENT "LC_ALL=C.UTF-8;TZ=UTC")
+endfunction()
+
+foreach(example IN ITEMS quickstart own_handler reconfigure)
+    zelvo_script_test(${example}_runs check_output
+        0 ${examples}/${example}.output $<TARGET_FILE:${example}>)
+endforeach()
+foreach(file IN ITEMS rules unicode)
+    zelvo_script_test(show_config_reads_${file} check_output
+        0 ${examples}/properties/${file}.output
+        $<TARGET_FILE:show_config> ${examples}/properties/${file}.properties)
+endforeach()
+zelvo_script_test(show_config_refuses_a_key_without_dot check_output
+    1 ${examples}/properties/no_dot.output
+    $<TARGET_FILE:show_config> ${examples}/properties/no_dot.properties)
+zelvo_script_test(demo_runs check_demo $<TARGET_FILE:zelvo_demo>)
+
+zelvo_script_test(doc_snippets_are_real check_doc_snippets ${PROJECT_SOURCE_DIR})
+zelvo_script_test(an_invented_snippet_is_noticed check_doc_snippets
+    ${PROJECT_SOURCE_DIR} ${CMAKE_CURRENT_SOURCE_DIR}/data/invented_snippet.md)
+set_tests_properties(an_invented_snippet_is_noticed PROPERTIES
+    PASS_REGULAR_EXPRESSION "not found under examples/:.*int invented")
+
+zelvo_script_test(zelvo_h_includes_every_header check_umbrella ${PROJECT_SOURCE_DIR}/include)
+
+# Another project that takes the tree in as a subdirectory.
+add_test(NAME subproject_configures
+    COMMAND ${CMAKE_COMMAND} -S ${examples}/subproject -B ${CMAKE_CURRENT_BINARY_DIR}/subproject
+        -G ${CMAKE_GENERATOR} -DCMAKE_CXX_COMPILER=${CMAKE_CXX_COMPILER}
+        -DCMAKE_C_COMPILER=${CMAKE_C_COMPILER})
