@@ -29,7 +29,7 @@ zelvo_script_test(an_invented_snippet_is_noticed check_doc_snippets
 set_tests_properties(an_invented_snippet_is_noticed PROPERTIES
     PASS_REGULAR_EXPRESSION "not found under examples/:.*int invented")
 
-zelvo_script_test(zelvo_h_includes_every_header check_umbrella ${PROJECT_SOURCE_DIR}/include)
+zelvo_script_test(zelvo_h_leads_to_every_header check_umbrella ${PROJECT_SOURCE_DIR}/include)
 
 # Another project that takes the tree in as a subdirectory.
 add_test(NAME subproject_configures
