@@ -12,6 +12,7 @@
 #include <string>
 
 #include "CxDirectory.h"
+#include "support/LongPath.h"
 #include "support/StatusIs.h"
 #include "support/TestDir.h"
 
@@ -93,7 +94,7 @@ TEST_F(CxDirectoryTest, OpenRefusesTheEmptyPath)
 
 TEST_F(CxDirectoryTest, OpenRefusesAPathThatDoesNotFitAPathRecord)
 {
-    std::string path = "./" + std::string(254, 'd');
+    std::string path = longPath(256);
     std::filesystem::create_directory(path);
     EXPECT_TRUE(failedWith(CxDirectoryOpen(&directory, path.c_str()), EINVAL));
     EXPECT_EQ(directory, nullptr);
@@ -101,7 +102,7 @@ TEST_F(CxDirectoryTest, OpenRefusesAPathThatDoesNotFitAPathRecord)
 
 TEST_F(CxDirectoryTest, OpenTakesALongPathThatFits)
 {
-    std::string path = "./" + std::string(253, 'd');
+    std::string path = longPath(255);
     std::filesystem::create_directory(path);
     EXPECT_TRUE(succeeded(CxDirectoryOpen(&directory, path.c_str())));
 }

@@ -11,6 +11,7 @@
 #include <string>
 
 #include "CxFile.h"
+#include "support/LongPath.h"
 #include "support/StatusIs.h"
 #include "support/TestDir.h"
 
@@ -18,12 +19,6 @@ namespace zelvo_test {
 namespace {
 
 constexpr int64_t twoTo32 = int64_t{1} << 32;
-
-/// A relative path of LENGTH bytes in the working directory; LENGTH is above 2.
-std::string pathOf(size_t length)
-{
-    return "./" + std::string(length - 2, 'n');
-}
 
 class CxFileNameTest : public TestDir {
 protected:
@@ -139,14 +134,14 @@ TEST_F(CxFileNameTest, RemoveRefusesNull)
 
 TEST_F(CxFileNameTest, RemoveTakesANameOf255Bytes)
 {
-    std::string name = write(pathOf(255), "x");
+    std::string name = write(longPath(255), "x");
     EXPECT_TRUE(succeeded(CxFileNameRemove(name.c_str())));
     EXPECT_FALSE(exists(name));
 }
 
 TEST_F(CxFileNameTest, RemoveRefusesANameOf256BytesAndRemovesNothing)
 {
-    std::string name = write(pathOf(256), "x");
+    std::string name = write(longPath(256), "x");
     EXPECT_TRUE(failedWith(CxFileNameRemove(name.c_str()), ENAMETOOLONG));
     EXPECT_TRUE(exists(name));
 }
@@ -184,7 +179,7 @@ TEST_F(CxFileNameTest, RenameRefusesNullArguments)
 
 TEST_F(CxFileNameTest, RenameRefusesAnOldNameOf256Bytes)
 {
-    std::string name = write(pathOf(256), "x");
+    std::string name = write(longPath(256), "x");
     EXPECT_TRUE(failedWith(CxFileNameRename(name.c_str(), "target"), ENAMETOOLONG));
     EXPECT_TRUE(exists(name));
     EXPECT_FALSE(exists("target"));
@@ -192,14 +187,14 @@ TEST_F(CxFileNameTest, RenameRefusesAnOldNameOf256Bytes)
 
 TEST_F(CxFileNameTest, RenameRefusesANewNameOf256Bytes)
 {
-    EXPECT_TRUE(failedWith(CxFileNameRename("dir/file", pathOf(256).c_str()), ENAMETOOLONG));
+    EXPECT_TRUE(failedWith(CxFileNameRename("dir/file", longPath(256).c_str()), ENAMETOOLONG));
     EXPECT_TRUE(exists("dir/file"));
 }
 
 TEST_F(CxFileNameTest, RenameTakesNamesOf255Bytes)
 {
-    EXPECT_TRUE(succeeded(CxFileNameRename("dir/file", pathOf(255).c_str())));
-    EXPECT_TRUE(succeeded(CxFileNameRename(pathOf(255).c_str(), "target")));
+    EXPECT_TRUE(succeeded(CxFileNameRename("dir/file", longPath(255).c_str())));
+    EXPECT_TRUE(succeeded(CxFileNameRename(longPath(255).c_str(), "target")));
     EXPECT_TRUE(exists("target"));
 }
 
@@ -229,7 +224,7 @@ TEST_F(CxFileNameTest, GetSizeTakesTheNameUnchanged)
 
 TEST_F(CxFileNameTest, GetSizeTakesANameOf256Bytes)
 {
-    std::string name = write(pathOf(256), "abcd");
+    std::string name = write(longPath(256), "abcd");
     uint64_t size = 0;
     EXPECT_TRUE(succeeded(CxFileNameGetSize(name.c_str(), &size)));
     EXPECT_EQ(size, 4U);

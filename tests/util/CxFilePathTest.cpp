@@ -10,6 +10,7 @@
 #include <string>
 
 #include "CxFilePath.h"
+#include "support/LongPath.h"
 #include "support/TestDir.h"
 
 namespace zelvo_test {
@@ -151,7 +152,7 @@ TEST(CxFilePathParentTest, DoesNotExistForABareName)
 
 TEST(CxFilePathParentTest, DoesNotExistForAnInvalidRecord)
 {
-    CxFilePath path = pathOf("a/" + std::string(300, 'p'));
+    CxFilePath path = pathOf(longPath(300));
     CxFilePath parent;
     EXPECT_EQ(CxFilePathParent(&path, &parent), 0);
 }

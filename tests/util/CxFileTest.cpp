@@ -12,6 +12,7 @@
 
 #include "CxFile.h"
 #include "support/FakeSystem.h"
+#include "support/LongPath.h"
 #include "support/StatusIs.h"
 #include "support/TestDir.h"
 
@@ -19,12 +20,6 @@ namespace zelvo_test {
 namespace {
 
 constexpr size_t allOnes = static_cast<size_t>(-1);
-
-/// The text of a name of LENGTH bytes.
-std::string nameOf(size_t length)
-{
-    return std::string(length, 'n');
-}
 
 /// Each test has an open file of ten bytes, "0123456789", at position 0.
 class CxFileTest : public TestDir {
@@ -146,7 +141,7 @@ TEST_F(CxFileOpenTest, ModeRefusesNullArguments)
 
 TEST_F(CxFileOpenTest, TakesALongPathThatFits)
 {
-    std::string name = "./" + nameOf(253);
+    std::string name = longPath(255);
     CxFile other = -1;
     EXPECT_TRUE(succeeded(CxFileOpen(&other, name.c_str(), O_WRONLY | O_CREAT)));
     EXPECT_TRUE(std::filesystem::exists(name));
@@ -155,7 +150,7 @@ TEST_F(CxFileOpenTest, TakesALongPathThatFits)
 
 TEST_F(CxFileOpenTest, RefusesANameOf256BytesAndCreatesNothing)
 {
-    std::string name = "./" + nameOf(254);
+    std::string name = longPath(256);
     CxFile other = 77;
     EXPECT_TRUE(failedWith(CxFileOpen(&other, name.c_str(), O_WRONLY | O_CREAT), ENAMETOOLONG));
     EXPECT_EQ(other, -1);
@@ -164,7 +159,7 @@ TEST_F(CxFileOpenTest, RefusesANameOf256BytesAndCreatesNothing)
 
 TEST_F(CxFileOpenTest, ModeRefusesANameOf256BytesAndCreatesNothing)
 {
-    std::string name = "./" + nameOf(254);
+    std::string name = longPath(256);
     CxFile other = 77;
     EXPECT_TRUE(
         failedWith(CxFileOpenMode(&other, name.c_str(), O_WRONLY | O_CREAT, 0600), ENAMETOOLONG));

@@ -117,10 +117,9 @@ TEST_F(CxTraceTest, ALeaveWithoutAnEnterWritesNoSpaces)
 
 TEST_F(CxTraceTest, ANullFormatLeavesEnterAndLeaveBalanced)
 {
-    const char *none = nullptr;
-    cxIntlTraceEnter(none);
-    cxIntlTracePoint(none);
-    cxIntlTraceLeave(none);
+    // Called through pointers, since the compilers refuse a null format where they see the callee.
+    for (void (*trace)(const char *, ...) : {cxIntlTraceEnter, cxIntlTracePoint, cxIntlTraceLeave})
+        trace(nullptr);
     EXPECT_EQ(CX_INTERNAL_TRACE_INDENT, 0);
 }
 
