@@ -252,12 +252,16 @@ TEST_F(ZlvConsoleHandler, PrintsTheTrailerWhenItIsReleased)
     EXPECT_EQ(console.seen(), "<log>\none\n</log>\n");
 }
 
-TEST_F(ZlvConsoleHandler, LosesItsFormatterBeforeATrailerWhenTheToolkitCloses)
+TEST_F(ZlvConsoleHandler, StillAliveWhenTheToolkitClosesPrintsNoTrailer)
 {
+    ZlvObject *last = ZlvGetObject("last", "zlv_consolehandler");
+    ZlvHandlerSetFormatter(last, screen_->handler.formatter);
+    ZlvAddListener(logger("zelvo.errorLogger"), last);
     Console console;
-    log(app_, u"one");
+    ZlvConsoleHandlerFOpen(last);
+    ZlvReleaseObject(last);
     close();
-    EXPECT_EQ(console.seen(), "<log>\none\n");
+    EXPECT_EQ(console.seen(), "<log>\n");
 }
 
 /* Variables and null arguments. */
