@@ -3,8 +3,8 @@
 #include <unicode/ucal.h>
 #include <unicode/uloc.h>
 
+#include <algorithm>
 #include <ostream>
-#include <regex>
 
 #include "ZlvBasicFormatter.h"
 #include "support/Recorder.h"
@@ -215,10 +215,10 @@ TEST_F(ZlvBasicFormatterDate, OfALoggedEventHasTheDefaultShape)
     ZlvObject *app = logger("app");
     ZlvAddListener(app, handler("screen"));
     std::string printed = console([&] { log(app, u"message"); });
-    EXPECT_TRUE(std::regex_match(
-        printed,
-        std::regex("\\d{4}-\\d\\d-\\d\\d \\d\\d:\\d\\d:\\d\\d\\.\\d{3}\\+00:00 message\n\n")))
-        << printed;
+    ASSERT_GT(printed.size(), 23u);
+    std::replace_if(
+        printed.begin(), printed.begin() + 23, [](char c) { return c >= '0' && c <= '9'; }, '9');
+    EXPECT_EQ(printed, "9999-99-99 99:99:99.999+00:00 message\n\n");
 }
 
 } // namespace
