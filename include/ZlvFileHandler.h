@@ -136,7 +136,8 @@ ZLV_API void ZlvFileHandlerFOpen(ZlvObject *handler);
  *
  * Every failure is handed to ZlvReportPlatformErr().
  *
- * @param handler  the handler; null, one without variables or without a file name does nothing
+ * @param handler  the handler; null, one without variables or without a file name does nothing, nor
+ *                 does a call from within the making of its header or trailer
  * @return '-' when the file is open or there was nothing to do; else the status of the failing
  *         CxFileOpenMode(), and the handler is closed
  * @lock the caller holds the API mutex
@@ -148,7 +149,7 @@ ZLV_API CxStatus ZlvFileHandlerFOpenWithErr(ZlvObject *handler);
  * ZlvReportPlatformErr(); the handler is closed in any case.
  *
  * @param handler  the handler; null, one without variables or a closed one does nothing; nor does a
- *                 call from within the trailer's own making
+ *                 call from within the making of its header or trailer
  * @lock the caller holds the API mutex
  */
 ZLV_API void ZlvFileHandlerFClose(ZlvObject *handler);
