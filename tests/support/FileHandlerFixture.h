@@ -62,6 +62,9 @@ protected:
         set(more...);
     }
 
+    /// Has handler() make one of another class.
+    void useClass(const char *className) { className_ = className; }
+
     /// The handler's variables.
     FileHandlerVars *vars() const { return static_cast<FileHandlerVars *>(handler_->vars); }
 

@@ -2,6 +2,8 @@
 // Formatter classes with records short enough to count, for tests of what handlers write.
 #pragma once
 
+#include <unicode/ustring.h>
+
 #include "CxMemory.h"
 #include "CxString.h"
 #include "CxUString.h"
@@ -9,7 +11,8 @@
 
 namespace zelvo_test {
 
-/// The class LineFormatter::plain, whose record is the event's text and a newline; the class
+/// The class LineFormatter::plain, whose record is the event's text and a newline, or nothing when
+/// there is no text; the class
 /// LineFormatter::framed, which adds a header and a trailer.
 class LineFormatter {
 public:
