@@ -39,7 +39,6 @@ bool namesRegularFile(const char *name, struct stat &facts)
 /// Takes the size from the test of the name, if that is the open file and below its limit.
 bool assumeSize(FileHandlerState &state, const struct stat &named)
 {
-    state.sizeAssumed = false;
     if (measureEachTime || identityOf(named) != state.opened)
         return false;
     state.vars.currentSize = static_cast<uint64_t>(named.st_size);
@@ -47,14 +46,18 @@ bool assumeSize(FileHandlerState &state, const struct stat &named)
     return state.sizeAssumed;
 }
 
+/// What follows the test of an open file. A write will find out whether its descriptor is good.
+enum class Next { A_WRITE, NOTHING };
+
 enum class LiveFile { READY, GONE, UNREADABLE, FULL };
 
-LiveFile inspect(FileHandlerState &state)
+LiveFile inspect(FileHandlerState &state, Next next)
 {
+    state.sizeAssumed = false;
     struct stat named;
     if (!namesRegularFile(state.vars.fullName, named))
         return LiveFile::GONE;
-    if (assumeSize(state, named))
+    if (next == Next::A_WRITE && assumeSize(state, named))
         return LiveFile::READY;
     if (!isOk(measureLogFile(state.vars)))
         return LiveFile::UNREADABLE;
@@ -126,6 +129,29 @@ CxStatus reopen(ZlvObject *handler)
     return status;
 }
 
+CxStatus openFor(Next next, ZlvObject *handler)
+{
+    FileHandlerState *state = namedStateOf(handler);
+    if (state == nullptr || state->framing)
+        return success;
+    const LiveFile live = state->vars.isOpen != 0 ? inspect(*state, next) : LiveFile::UNREADABLE;
+    if (live == LiveFile::READY)
+        return success;
+    if (live == LiveFile::GONE)
+        ZlvFileHandlerFClose(handler);
+    else if (live == LiveFile::FULL)
+        rollOver(handler);
+    return reopen(handler);
+}
+
+/// Does what a test of the descriptor would have done, where no write has followed after all.
+void makeUpForNoWrite(ZlvObject *handler)
+{
+    const FileHandlerState *state = stateOf(handler);
+    if (state != nullptr && state->vars.isOpen != 0 && state->sizeAssumed)
+        openFor(Next::NOTHING, handler);
+}
+
 /// Writes a record; its bytes are added to a size that was assumed, else the size is measured.
 CxStatus append(FileHandlerState &state, const char *record)
 {
@@ -161,7 +187,10 @@ CxStatus writeRecord(ZlvObject *handler, const char *record)
 CxStatus writeText(ZlvObject *handler, const UChar *text)
 {
     const OwnedStr record{CxUStringDupUCharToStr(text)};
-    return record ? writeRecord(handler, record.get()) : reported(platformError(ENOMEM));
+    if (record)
+        return writeRecord(handler, record.get());
+    makeUpForNoWrite(handler);
+    return text != nullptr ? reported(platformError(ENOMEM)) : success;
 }
 
 } // namespace
@@ -170,10 +199,10 @@ void ZlvFileUHandlerFProcess(ZlvObject *handler, ZlvEvent *event, va_list args)
 {
     if (event == nullptr || stateOf(handler) == nullptr || !zlvIntlIsObjectEnabled(handler))
         return;
-    const CxStatus opened = ZlvFileHandlerFOpenWithErr(handler);
+    const CxStatus opened = openFor(Next::A_WRITE, handler);
     noteFailure(event, opened);
     const OwnedUStr text{zlvIntlUHandlerDoFmt(handler, event, args)};
-    if (text && isOk(opened))
+    if (isOk(opened))
         noteFailure(event, writeText(handler, text.get()));
     ZlvBasicObjectFLog(handler, event, args);
 }
@@ -185,17 +214,7 @@ void ZlvFileHandlerFOpen(ZlvObject *handler)
 
 CxStatus ZlvFileHandlerFOpenWithErr(ZlvObject *handler)
 {
-    FileHandlerState *state = namedStateOf(handler);
-    if (state == nullptr || state->framing)
-        return success;
-    const LiveFile live = state->vars.isOpen != 0 ? inspect(*state) : LiveFile::UNREADABLE;
-    if (live == LiveFile::READY)
-        return success;
-    if (live == LiveFile::GONE)
-        ZlvFileHandlerFClose(handler);
-    else if (live == LiveFile::FULL)
-        rollOver(handler);
-    return reopen(handler);
+    return openFor(Next::NOTHING, handler);
 }
 
 void ZlvFileHandlerFClose(ZlvObject *handler)
