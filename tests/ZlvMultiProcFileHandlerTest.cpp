@@ -20,13 +20,6 @@ protected:
         ZlvMultiProcFileUHandlerFProcess(handler, event, none);
         va_end(none);
     }
-
-    /// An answer for semget that refuses to make a set.
-    static int refuse(key_t /*key*/, int /*count*/, int /*flags*/)
-    {
-        errno = ENOSPC;
-        return -1;
-    }
 };
 
 TEST_F(ZlvMultiProcFileHandler, WritesTheRecordAndAddsNothing)
@@ -53,122 +46,6 @@ TEST_F(ZlvMultiProcFileHandler, AppendsWhateverItsPropertySays)
     handler("fileName", "app.log", "appending", "false");
     log(u"a");
     EXPECT_EQ(file("app.log"), "before\na\n");
-}
-
-TEST_F(ZlvMultiProcFileHandler, SetsTheSemaphoreUpWithTheFirstRecord)
-{
-    handler("fileName", "app.log");
-    EXPECT_EQ(semSet(), -1);
-    log(u"a");
-    EXPECT_EQ(semValue(), 1);
-    EXPECT_EQ(vars()->semReady, 1);
-}
-
-TEST_F(ZlvMultiProcFileHandler, OpensWithoutTestingTheSizeOrWriting)
-{
-    write("app.log", std::string(2000, 'x'));
-    framedHandler("fileName", "app.log", "maxFileSize", "10");
-    EXPECT_TRUE(succeeded(openHandler()));
-    EXPECT_EQ(file("app.log"), std::string(2000, 'x'));
-    EXPECT_EQ(vars()->isOpen, 1);
-}
-
-TEST_F(ZlvMultiProcFileHandler, OpensAnOpenFileNoSecondTime)
-{
-    handler("fileName", "app.log");
-    openHandler();
-    std::filesystem::remove("app.log");
-    EXPECT_TRUE(succeeded(openHandler()));
-    EXPECT_EQ(file("app.log"), std::nullopt);
-}
-
-TEST_F(ZlvMultiProcFileHandler, MakesTheDirectoryAndItsParents)
-{
-    handler("fileName", "a/b/app.log", "dirPermission", "750");
-    log(u"a");
-    EXPECT_EQ(file("a/b/app.log"), "a\n");
-    EXPECT_EQ(modeOf("a/b"), 0750u);
-}
-
-TEST_F(ZlvMultiProcFileHandler, GivesTheFileItsPermission)
-{
-    handler("fileName", "app.log", "filePermission", "640");
-    log(u"a");
-    EXPECT_EQ(modeOf("app.log"), 0640u);
-}
-
-TEST_F(ZlvMultiProcFileHandler, ReportsADirectoryThatCannotBeMadeAndTriesAllTheSame)
-{
-    FakeSystem system;
-    system.mkdir = [](const char *path, mode_t) {
-        std::filesystem::create_directory(path);
-        errno = EACCES;
-        return -1;
-    };
-    handler("fileName", "a/app.log");
-    FileFaults faults;
-    EXPECT_TRUE(succeeded(openHandler()));
-    EXPECT_EQ(faults.reports, 1u);
-    EXPECT_TRUE(failedWith(faults.reported, EACCES));
-    EXPECT_EQ(file("a/app.log"), "");
-}
-
-TEST_F(ZlvMultiProcFileHandler, ReportsAndGivesAFailureToOpen)
-{
-    std::filesystem::create_directory("app.log");
-    handler("fileName", "app.log");
-    FileFaults faults;
-    EXPECT_TRUE(failedWith(openHandler(), EISDIR));
-    EXPECT_EQ(faults.reports, 1u);
-    EXPECT_EQ(vars()->isOpen, 0);
-}
-
-TEST_F(ZlvMultiProcFileHandler, TheClassesOwnEntryDropsTheStatus)
-{
-    std::filesystem::create_directory("app.log");
-    handler("fileName", "app.log");
-    zelvo::ApiLock lock;
-    handler_->objClass->handler.fOpen(handler_);
-    EXPECT_EQ(vars()->isOpen, 0);
-}
-
-TEST_F(ZlvMultiProcFileHandler, OpensNothingWithoutAHandlerVariablesOrName)
-{
-    EXPECT_TRUE(succeeded(openHandler()));
-    handler_ = object("recorder", Recorder::className);
-    EXPECT_TRUE(succeeded(openHandler()));
-    handler("fileName", nullptr);
-    EXPECT_TRUE(succeeded(openHandler()));
-    EXPECT_EQ(vars()->semReady, 0);
-    ZlvMultiProcFileHandlerFOpen(nullptr);
-}
-
-TEST_F(ZlvMultiProcFileHandler, OpensNothingWithoutASemaphoreButSucceeds)
-{
-    handler("fileName", "app.log");
-    FakeSystem system;
-    system.semget = refuse;
-    FileFaults faults;
-    EXPECT_TRUE(succeeded(openHandler()));
-    EXPECT_EQ(faults.reports, 1u);
-    EXPECT_TRUE(failedWith(faults.reported, ENOSPC));
-    EXPECT_EQ(vars()->isOpen, 0);
-    EXPECT_EQ(file("app.log"), std::nullopt);
-}
-
-TEST_F(ZlvMultiProcFileHandler, DropsEventsWhileThereIsNoSemaphore)
-{
-    handler("fileName", "app.log");
-    listenToHandler();
-    {
-        FakeSystem system;
-        system.semget = refuse;
-        log(u"lost");
-    }
-    EXPECT_TRUE(Recorder::records().empty());
-    EXPECT_EQ(LineFormatter::formatted(), 0);
-    log(u"a");
-    EXPECT_EQ(file("app.log"), "a\n");
 }
 
 TEST_F(ZlvMultiProcFileHandler, DropsTheEventWhenTheFileCannotBeOpened)
