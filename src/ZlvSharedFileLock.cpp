@@ -4,10 +4,10 @@
 #include "ZlvMultiProcFileHandler.h"
 
 #include <cerrno>
+#include <ctime>
 #include <iterator>
 #include <sys/sem.h>
 
-#include "CxThread.h"
 #include "ZlvFileHandlerIntl.h"
 #include "util/CxStatusIntl.h"
 
@@ -17,7 +17,6 @@ namespace {
 
 constexpr int EVERY_USER = 0666;
 constexpr int MOST_FAILURES = 11;
-constexpr uint32_t PAUSE_MILLISECONDS = 1000;
 
 /// The last argument of semctl(), which the platform leaves to its callers to declare.
 union SemaphoreArgument {
@@ -64,6 +63,15 @@ CxStatus giveBackIfHeld(int32_t id)
     return statusOfCall(semop(id, steps, std::size(steps)));
 }
 
+/// Signals do not shorten it: a storm of them would use up all attempts in a moment, while another
+/// process is still writing.
+void pauseForASecond()
+{
+    timespec rest{.tv_sec = 1, .tv_nsec = 0};
+    while (nanosleep(&rest, &rest) == -1 && errno == EINTR)
+        continue;
+}
+
 bool mayPass(CxStatus status)
 {
     return status.code == ENOSPC || status.code == EINTR;
@@ -91,7 +99,7 @@ ZlvBool zlvMultiProcFileHandlerLockSem(ZlvObject *handler)
     for (int failures = 1; mayPass(status); ++failures) {
         if (failures == MOST_FAILURES)
             return 1;
-        CxThreadSleep(PAUSE_MILLISECONDS);
+        pauseForASecond();
         status = take(vars->semId);
     }
     return isOk(reported(status));

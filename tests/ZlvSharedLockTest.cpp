@@ -94,9 +94,9 @@ protected:
     {
         ZlvSharedLock::SetUp();
         initSem();
-        system_.sleep = [this](unsigned seconds) {
-            pauses_.push_back(seconds);
-            return 0u;
+        system_.nanosleep = [this](const timespec *time, timespec *) {
+            pauses_.push_back(static_cast<unsigned>(time->tv_sec));
+            return 0;
         };
         system_.semop = [this](int, struct sembuf *, size_t) {
             errno = GetParam().code;
@@ -115,6 +115,20 @@ TEST_P(ZlvSharedLockPauses, AreNotMadeWithoutAFailure)
 {
     EXPECT_TRUE(lockSem());
     EXPECT_TRUE(pauses_.empty());
+}
+
+TEST_P(ZlvSharedLockPauses, GoOnAfterASignalWithWhatIsLeft)
+{
+    std::vector<long> times;
+    system_.nanosleep = [&times](const timespec *time, timespec *rest) {
+        times.push_back(time->tv_nsec);
+        *rest = {.tv_sec = 0, .tv_nsec = 7};
+        errno = EINTR;
+        return times.size() < 3 ? -1 : 0;
+    };
+    failures_ = 1;
+    EXPECT_TRUE(lockSem());
+    EXPECT_EQ(times, (std::vector<long>{0, 7, 7}));
 }
 
 TEST_P(ZlvSharedLockPauses, FollowOneFailure)
@@ -161,7 +175,7 @@ TEST_P(ZlvSharedLockFailures, AreReportedWithoutAPause)
     initSem();
     FakeSystem system;
     int pauses = 0;
-    system.sleep = [&](unsigned) { return static_cast<unsigned>(pauses++); };
+    system.nanosleep = [&](const timespec *, timespec *) { return pauses++; };
     system.semop = [](int, struct sembuf *, size_t) {
         errno = GetParam().code;
         return -1;

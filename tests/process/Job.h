@@ -13,7 +13,7 @@ namespace zelvo_test {
 struct Job {
     std::string file = "shared.log";
     std::string progress{}; ///< file that holds the writer's Progress
-    int32_t key = 0;      ///< of the semaphore
+    int32_t key = 0;        ///< of the semaphore
     int32_t maxBytes = 64 * 1024;
     int32_t maxFiles = 400;
     uint32_t seed = 1;

@@ -13,7 +13,9 @@ namespace {
 
 constexpr uint32_t WRITERS = 4;
 constexpr uint32_t KILLS = 200;
-constexpr uint32_t MOST_RECORDS_BETWEEN = 400;
+constexpr uint32_t MOST_RECORDS_BETWEEN = 150;
+constexpr uint32_t MOST_MICROSECONDS_MORE = 2000;
+constexpr int32_t MAX_BYTES = 16 * 1024; // a good part of all time is spent in rollovers
 constexpr int32_t MOST_FILES = 2000;
 
 class Kills : public SharedLogTest {
@@ -24,11 +26,13 @@ protected:
 
         void start() { process = std::make_unique<WriterProcess>(WRITER, job); }
 
-        /// Kills the process once it has written so many more records, and starts another.
-        void killAfter(uint32_t records)
+        /// Kills the process once it has written so many more records and a while has passed, and
+        /// starts another.
+        void killAfter(uint32_t records, uint32_t microseconds)
         {
             const uint32_t goal = progress->acknowledged + records;
             EXPECT_TRUE(eventually([&] { return progress->acknowledged >= goal; }));
+            usleep(microseconds);
             process->kill();
             if (progress->begun != progress->acknowledged)
                 unanswered.insert(progress->begun);
@@ -47,6 +51,7 @@ protected:
     {
         for (uint32_t writer = 0; writer < WRITERS; ++writer) {
             Job job = jobFor(writer, 0);
+            job.maxBytes = MAX_BYTES;
             job.maxFiles = MOST_FILES;
             roles_.push_back(std::make_unique<Role>(job));
         }
@@ -55,9 +60,12 @@ protected:
     void killAtRandom()
     {
         std::minstd_rand random(20);
+        const auto next = [&random](uint32_t bound) {
+            return static_cast<uint32_t>(random() % bound);
+        };
         for (uint32_t kill = 0; kill < KILLS; ++kill)
-            roles_[random() % WRITERS]->killAfter(
-                static_cast<uint32_t>(random() % MOST_RECORDS_BETWEEN));
+            roles_[next(WRITERS)]->killAfter(next(MOST_RECORDS_BETWEEN),
+                                             next(MOST_MICROSECONDS_MORE));
     }
 
     void stopAll()
@@ -113,7 +121,7 @@ TEST_F(Kills, LoseNoAcknowledgedRecordAndLeaveTheSemaphoreFree)
 TEST_F(Kills, LetTheNextWriterProceed)
 {
     for (uint32_t kill = 0; kill < 20; ++kill)
-        roles_[kill % WRITERS]->killAfter(kill);
+        roles_[kill % WRITERS]->killAfter(kill, 0);
     stopAll();
     const auto start = std::chrono::steady_clock::now();
     EXPECT_EQ(runWriter(jobFor(WRITERS, 1)), WRITER_DONE);

@@ -19,7 +19,7 @@ public:
     ~OwnSemaphore() { remove(); }
 
     /// No two processes of one machine have it at the same time.
-    int32_t key() const { return 0x5A000000 | (getpid() & 0xFFFFFF); }
+    int32_t key() const { return key_; }
     /// -1 when there is no set.
     int id() const { return semget(key(), 1, 0); }
     int value() const { return semctl(id(), 0, GETVAL); }
@@ -35,6 +35,9 @@ public:
         sembuf down{.sem_num = 0, .sem_op = -1, .sem_flg = SEM_UNDO};
         return semop(id(), &down, 1) == 0;
     }
+
+private:
+    int32_t key_ = 0x5A000000 | (getpid() & 0xFFFFFF);
 };
 
 } // namespace zelvo_test

@@ -25,11 +25,11 @@ constexpr size_t MOST_RECORDS_OF_A_FILE = MAX_BYTES / 100 + 1;
 const Step STEPS[] = {
     {"BeforeTheFirstRename", "rename 17", false, 0},
     {"BetweenTheRenames", "rename 24", false, 0},
-    {"BeforeTheCopy", "lseek 5", false, 0},
+    {"BeforeTheCopy", "lseek 7", false, 0},
     {"InTheMiddleOfTheCopy", "write 21", true, 1},
     {"BeforeTheFlush", "fsync 3", true, 0},
     {"BeforeTheLiveFileIsEmptied", "ftruncate 3", true, 0},
-    {"AfterTheLiveFileIsEmptied", "lseek 6", false, 0},
+    {"AfterTheLiveFileIsEmptied", "lseek 9", false, 0},
 };
 
 class RolloverKills : public SharedLogTest, public testing::WithParamInterface<Step> {

@@ -7,6 +7,7 @@
 
 #include "process/Records.h"
 #include "process/WriterProcess.h"
+#include "support/Child.h"
 
 using namespace zelvo_test;
 
@@ -60,20 +61,17 @@ TEST_F(SemaphoreFaults, SignalsDuringAWaitEndItUnguardedAfterTenWholeSeconds)
 TEST_F(SemaphoreFaults, AHolderThatDiesLetsTheWaitingWriterProceed)
 {
     ASSERT_EQ(runWriter(jobFor(0, 1)), WRITER_DONE);
-    const pid_t holder = fork();
-    if (holder == 0) {
+    Child holder([this] {
         semaphore_.take();
-        for (;;)
-            pause();
-    }
-    ASSERT_TRUE(eventually([&] { return semaphore_.value() == 0; }));
+        return pause();
+    });
+    ASSERT_TRUE(eventually([this] { return semaphore_.value() == 0; }));
     WriterProcess writer(WRITER, jobFor(1, 1));
     EXPECT_TRUE(eventuallyWaiting(1));
     const auto start = std::chrono::steady_clock::now();
-    kill(holder, SIGKILL);
+    holder.kill();
     EXPECT_EQ(writer.result(), WRITER_DONE);
     std::printf("proceeded after %.3f s\n", secondsSince(start));
-    waitpid(holder, nullptr, 0);
     EXPECT_EQ(Census(directory(), 1).distinct(), 2U);
     EXPECT_EQ(semaphore_.value(), 1);
 }

@@ -30,13 +30,17 @@ protected:
     }
 };
 
-/// The kernel's list of sets, without their times.
+/// The kernel's list of sets, each with its key, id, permissions and number of semaphores.
 std::string sets()
 {
     std::ifstream list("/proc/sysvipc/sem");
     std::string text;
-    for (std::string line; std::getline(list, line);)
-        text += line.substr(0, 80) + '\n';
+    for (std::string line; std::getline(list, line);) {
+        std::istringstream fields(line);
+        std::string field;
+        for (int count = 0; count < 4 && fields >> field; ++count)
+            text += field + ' ';
+    }
     return text;
 }
 

@@ -54,6 +54,7 @@ ANSWER(int, pthread_create,
 ANSWER(int, pthread_join, (pthread_t thread, void **result), (thread, result))
 ANSWER(int, sched_yield, (), ())
 ANSWER(unsigned, sleep, (unsigned seconds), (seconds))
+ANSWER(int, nanosleep, (const struct timespec *time, struct timespec *rest), (time, rest))
 ANSWER(int, gettimeofday, (struct timeval * now, void *zone), (now, zone))
 ANSWER(int, gethostname, (char *name, size_t size), (name, size))
 ANSWER(struct hostent *, gethostbyname, (const char *name), (name))

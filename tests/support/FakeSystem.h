@@ -40,6 +40,7 @@ struct FakeSystem {
     std::function<int(pthread_t, void **)> pthread_join;
     std::function<int()> sched_yield;
     std::function<unsigned(unsigned)> sleep;
+    std::function<int(const struct timespec *, struct timespec *)> nanosleep;
     std::function<int(struct timeval *, void *)> gettimeofday;
     std::function<int(char *, size_t)> gethostname;
     std::function<struct hostent *(const char *)> gethostbyname;
