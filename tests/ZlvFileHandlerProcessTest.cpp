@@ -55,8 +55,10 @@ TEST_F(ZlvFileHandlerProcess, WithoutTextFromTheFormatterWritesNothing)
 TEST_F(ZlvFileHandlerProcess, WritesALongRecordWhole)
 {
     handler("fileName", "app.log");
-    log(std::u16string(100000, u'x').c_str());
-    EXPECT_EQ(file("app.log"), std::string(100000, 'x') + "\n");
+    std::string line(100000, 'x');
+    log(std::u16string(line.begin(), line.end()).c_str());
+    line += '\n';
+    EXPECT_EQ(file("app.log"), line);
 }
 
 TEST_F(ZlvFileHandlerProcess, MeasuresTheFileAfterTheRecord)
