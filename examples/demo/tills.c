@@ -3,6 +3,7 @@
 #define _XOPEN_SOURCE 700
 #include <stdio.h>
 #include <stdlib.h>
+#include <string.h>
 #include <sys/sem.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -52,10 +53,12 @@ static int countFile(const char *name, int records[TILLS + 1])
     if (file == NULL)
         return 0;
     char line[128];
-    int till;
-    while (fgets(line, sizeof line, file) != NULL)
-        if (sscanf(line, "%*s | till %d sale %*d", &till) == 1 && till >= 1 && till <= TILLS)
+    while (fgets(line, sizeof line, file) != NULL) {
+        const char *mark = strstr(line, " | till ");
+        const long till = mark != NULL ? strtol(mark + strlen(" | till "), NULL, 10) : 0;
+        if (till >= 1 && till <= TILLS && strchr(line, '\n') != NULL)
             ++records[till];
+    }
     fclose(file);
     remove(name);
     return 1;
