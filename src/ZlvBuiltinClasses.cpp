@@ -5,6 +5,10 @@
 #include "ZlvConsoleHandler.h"
 #include "ZlvIntl.h"
 #include "ZlvLevelFilter.h"
+#include "ZlvMsgIdFilter.h"
+#include "ZlvPDLogger.h"
+#include "ZlvPDXMLFormatter.h"
+#include "ZlvVyxTraceFormatter.h"
 
 namespace {
 
@@ -22,6 +26,14 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvBasicLoggerFCfgChange}},
+    {"zlv_pdlogger",
+     {.kind = ZLV_KIND_LOGGER,
+      .name = nullptr,
+      .description = nullptr,
+      .logger = {.fLog = ZlvPDLoggerFLog},
+      .fAllocVars = ZlvPDLoggerFAllocVars,
+      .fFreeVars = ZlvPDLoggerFFreeVars,
+      .fCfgChange = ZlvPDLoggerFCfgChange}},
     {"zlv_levelfilter",
      {.kind = ZLV_KIND_FILTER,
       .name = nullptr,
@@ -32,6 +44,16 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvLevelFilterFCfgChange}},
+    {"zlv_msgidfilter",
+     {.kind = ZLV_KIND_FILTER,
+      .name = nullptr,
+      .description = nullptr,
+      .filter = {.fProcess = ZlvBasicFilterFProcess,
+                 .fIsLoggable = ZlvMsgIdFilterFIsLoggable,
+                 .fLog = ZlvBasicObjectFLog},
+      .fAllocVars = ZlvMsgIdFilterFAllocVars,
+      .fFreeVars = ZlvMsgIdFilterFFreeVars,
+      .fCfgChange = ZlvMsgIdFilterFCfgChange}},
     {"zlv_consolehandler",
      {.kind = ZLV_KIND_HANDLER,
       .name = nullptr,
@@ -53,6 +75,28 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvBasicFormatterFCfgChange}},
+    {"zlv_xmlformatter",
+     {.kind = ZLV_KIND_FORMATTER,
+      .name = nullptr,
+      .description = nullptr,
+      .formatter = {.fFormat = ZlvPDXMLUFormatterFFormat,
+                    .fGetHeader = ZlvPDXMLFormatterFGetHeader,
+                    .fGetTrailer = ZlvPDXMLFormatterFGetTrailer,
+                    .fBindMsg = zlvIntlBindUI18Msg},
+      .fAllocVars = ZlvPDXMLFormatterFAllocVars,
+      .fFreeVars = ZlvPDXMLFormatterFFreeVars,
+      .fCfgChange = ZlvPDXMLFormatterFCfgChange}},
+    {"zlv_vyxtraceformatter",
+     {.kind = ZLV_KIND_FORMATTER,
+      .name = nullptr,
+      .description = nullptr,
+      .formatter = {.fFormat = ZlvVyxTraceUFormatterFFormat,
+                    .fGetHeader = ZlvBasicFormatterFGetHeader,
+                    .fGetTrailer = ZlvBasicFormatterFGetTrailer,
+                    .fBindMsg = zlvIntlBindUI18Msg},
+      .fAllocVars = nullptr,
+      .fFreeVars = nullptr,
+      .fCfgChange = nullptr}},
 };
 
 } // namespace
