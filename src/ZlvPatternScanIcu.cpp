@@ -17,7 +17,7 @@ using Word = std::u16string_view;
 constexpr int32_t DEEPEST = 64;
 
 /// What a text is nested in, which decides what ends it and what can be quoted in it.
-enum class Within : uint8_t { NOTHING, CHOICE, BRANCHES };
+enum class Within : uint8_t { NOTHING, CHOICE, PLURAL, SELECT };
 
 struct Type {
     Word name;
@@ -31,9 +31,9 @@ constexpr Type types[] = {
     {u"ordinal", Within::NOTHING, ArgKind::DOUBLE},
     {u"duration", Within::NOTHING, ArgKind::DOUBLE},
     {u"choice", Within::CHOICE, ArgKind::DOUBLE},
-    {u"plural", Within::BRANCHES, ArgKind::DOUBLE},
-    {u"selectordinal", Within::BRANCHES, ArgKind::DOUBLE},
-    {u"select", Within::BRANCHES, ArgKind::TEXT},
+    {u"plural", Within::PLURAL, ArgKind::DOUBLE},
+    {u"selectordinal", Within::PLURAL, ArgKind::DOUBLE},
+    {u"select", Within::SELECT, ArgKind::TEXT},
 };
 constexpr Type otherType{u"", Within::NOTHING, ArgKind::UNKNOWN};
 
@@ -102,7 +102,7 @@ private:
     static bool canBeQuoted(UChar c, Within within)
     {
         return c == u'{' || c == u'}' || (c == u'|' && within == Within::CHOICE) ||
-               (c == u'#' && within == Within::BRANCHES);
+               (c == u'#' && within == Within::PLURAL);
     }
 
     /// Behind a quote: skips a second one, or quoted text up to and with its closing quote.
@@ -175,13 +175,18 @@ private:
         if (*at_ != u',')
             return true;
         ++at_;
-        if (type.style != Within::NOTHING)
-            return type.style == Within::CHOICE ? choices(depth) : branches(depth);
+        if (type.style == Within::NOTHING)
+            return simplyStyled(number, type);
+        return type.style == Within::CHOICE ? choices(depth) : branches(type.style, depth);
+    }
+
+    bool simplyStyled(int64_t number, const Type &type)
+    {
         const UChar *start = at_;
         if (!simpleStyle())
             return false;
         const Word style{start, static_cast<size_t>(at_ - start)};
-        if (isWord(type.name, u"number") && isWord(trimmed(style), u"integer"))
+        if (type.name == u"number" && isWord(trimmed(style), u"integer"))
             kinds_.set(number, ArgKind::INTEGER);
         return true;
     }
@@ -216,14 +221,14 @@ private:
     }
 
     /// Reads names, each with the text in braces behind it.
-    bool branches(int32_t depth)
+    bool branches(Within within, int32_t depth)
     {
         for (;;) {
             run([](UChar c) { return c != u'{' && c != u'}'; });
             if (*at_ != u'{')
                 return *at_ == u'}';
             ++at_;
-            if (!text(Within::BRANCHES, depth + 1) || *at_ != u'}')
+            if (!text(within, depth + 1) || *at_ != u'}')
                 return false;
             ++at_;
         }
