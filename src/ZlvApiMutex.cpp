@@ -21,10 +21,38 @@ std::atomic_ref<ZlvBool> exists()
     return std::atomic_ref<ZlvBool>(ZLV_TK_API_MUTEX_EXISTS);
 }
 
+// Whether this thread holds the API mutex, which a class function may do when it forks.
+thread_local bool held = false;
+
+// A fork waits until no other thread is inside the library. The child, whose only thread is the one
+// that forked, thus finds the mutex free and everything under it whole.
+void beforeFork()
+{
+    pthread_mutex_lock(&creation);
+    if (!held && exists().load(std::memory_order_relaxed) == 1)
+        CxMutexLock(ZLV_TK_API_MUTEX);
+}
+
+void afterFork()
+{
+    if (!held && exists().load(std::memory_order_relaxed) == 1)
+        CxMutexUnlock(ZLV_TK_API_MUTEX);
+    pthread_mutex_unlock(&creation);
+}
+
+/// The caller holds the creation mutex.
+void watchForks()
+{
+    static bool watching = false;
+    if (!watching)
+        watching = pthread_atfork(beforeFork, afterFork, afterFork) == 0;
+}
+
 CxStatus createOnce()
 {
     CxStatus status{CX_STATUS_OK, 0};
     pthread_mutex_lock(&creation);
+    watchForks();
     if (exists().load(std::memory_order_relaxed) == 0) {
         status = CxMutexCreate(&ZLV_TK_API_MUTEX);
         if (status.type == CX_STATUS_OK)
@@ -49,7 +77,9 @@ ZlvBool zlvAPIMutexLock(void)
 {
     if (exists().load(std::memory_order_acquire) == 0 && succeeded(createOnce()) == 0)
         return 0;
-    return succeeded(CxMutexLock(ZLV_TK_API_MUTEX));
+    const ZlvBool locked = succeeded(CxMutexLock(ZLV_TK_API_MUTEX));
+    held = locked == 1;
+    return locked;
 }
 
 void zlvAPIMutexUnlock(void)
@@ -57,6 +87,7 @@ void zlvAPIMutexUnlock(void)
     if (exists().load(std::memory_order_relaxed) == 0)
         return;
     zelvo::freeDeferred();
+    held = false;
     succeeded(CxMutexUnlock(ZLV_TK_API_MUTEX));
 }
 

@@ -42,15 +42,27 @@ void displace(ZlvObjClass *displaced, const ZlvObjClass *successor)
     zlvFreeObjClass(displaced);
 }
 
+/// Lists a name; tells whether it is in the list now. A kind without a list needs none.
+bool list(StringGroup *names, const char *name)
+{
+    zlvIntlStringGroupAdd(names, name);
+    return names == nullptr || ZlvStringGroupGetLink(names, name) != nullptr;
+}
+
+/// Registers a class wholly or not at all. One whose name the map could not copy is found by nobody
+/// but stays in the map, which owns it until close.
 void put(const char *name, ZlvObjClass *objClass)
 {
     ZlvObjClass *displaced = zlvToolkitGetClassDef(name);
-    if (zlvIntlStringToObjClassMapPut(ZLV_TK_CLASSES, name, objClass) == 0) {
+    StringGroup *names = namesOf(objClass->kind);
+    if (!list(names, name) || zlvIntlStringToObjClassMapPut(ZLV_TK_CLASSES, name, objClass) == 0) {
+        zlvIntlStringGroupRem(names, name);
         zlvFreeObjClass(objClass);
         return;
     }
+    if (zlvToolkitGetClassDef(name) != objClass)
+        zlvIntlStringGroupRem(names, name);
     displace(displaced, objClass);
-    zlvIntlStringGroupAdd(namesOf(objClass->kind), name);
 }
 
 } // namespace

@@ -33,6 +33,19 @@ void detachFormatter(ZlvObject *object)
     zlvIntlReleaseObject(formatter);
 }
 
+/// Takes the entry of OBJECT away again when its name could not be copied: no lookup would ever
+/// find it, and it would outlive an object that its maker gives up. Not by a release, which would
+/// destroy an object that nobody else holds yet.
+void removeNameless(ZlvObject *object)
+{
+    StringToObjMapNode *newest = ZLV_TK_INSTANCES->last;
+    if (newest == nullptr || newest->key != nullptr)
+        return;
+    zlvIntlAcquireObject(object);
+    zlvIntlStringToObjMapRemNode(ZLV_TK_INSTANCES, newest);
+    --object->refCount;
+}
+
 /// First pass: variables go and handlers lose their formatters. Either can run foreign code that
 /// changes the registry, and then the walk begins again. It ends, since nothing is created while
 /// the toolkit closes and variables are freed once.
@@ -72,7 +85,8 @@ void zlvToolkitAddObjInstance(const char *name, ZlvObject *object)
     if (ZLV_TK_INSTANCES == nullptr)
         ZLV_TK_INSTANCES = zlvIntlAllocStringToObjMap();
     ++generation;
-    zlvIntlStringToObjMapPut(ZLV_TK_INSTANCES, name, object);
+    if (zlvIntlStringToObjMapPut(ZLV_TK_INSTANCES, name, object) == 1)
+        removeNameless(object);
 }
 
 ZlvObject *zlvToolkitGetObjInstance(const char *name)

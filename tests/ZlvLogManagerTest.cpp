@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// The registry of configurations: finding, making and naming them, its own life, the file's entry.
+// The registry of configurations: finding, making, naming, removing and updating them.
 #include "ZlvLogManager.h"
 
 #include <thread>
@@ -11,14 +11,7 @@
 namespace zelvo_test {
 namespace {
 
-class ZlvLogManager : public CfgFixture {
-protected:
-    static ZlvBool addFromFile(const char *name, const char *key, const char *value)
-    {
-        HeldMutex held;
-        return zlvLogMgrAddCfgFromFile(name, key, value);
-    }
-};
+class ZlvLogManager : public CfgFixture {};
 
 TEST_F(ZlvLogManager, GetMakesAndRegistersAnUnknownConfiguration)
 {
@@ -40,7 +33,8 @@ TEST_F(ZlvLogManager, GetFindsARegisteredConfigurationAndAddsAReference)
 
 TEST_F(ZlvLogManager, GetTellsUpperAndLowerCaseApart)
 {
-    EXPECT_NE(get("a"), get("A"));
+    ZlvObjCfg *lower = get("a");
+    EXPECT_NE(get("A"), lower);
     EXPECT_EQ(registered(), (Names{"a", "A"}));
 }
 
@@ -219,62 +213,6 @@ TEST_F(ZlvLogManager, ThreadsThatGetOneNameMakeItOnce)
     EXPECT_EQ(registered(), (Names{"a", "a.b", "a.b.c", "d"}));
 }
 
-TEST_F(ZlvLogManager, FromFileMakesAMarkedConfigurationWithTheProperty)
-{
-    EXPECT_EQ(addFromFile("a.b", "p", "v"), 1);
-    ZlvObjCfg *cfg = get("a.b");
-    EXPECT_EQ(lookup(cfg, "p"), "v");
-    EXPECT_EQ(ZlvObjCfgIsFromFile(cfg), 1);
-    EXPECT_EQ(cfg->refCount, 2U);
-    EXPECT_EQ(registered(), Names{"a.b"});
-}
-
-TEST_F(ZlvLogManager, FromFileAddsToAConfigurationOfTheSameFile)
-{
-    addFromFile("a", "p", "v");
-    addFromFile("a", "q", "w");
-    addFromFile("a", "p", "x");
-    ZlvObjCfg *cfg = get("a");
-    EXPECT_EQ(lookup(cfg, "p"), "x");
-    EXPECT_EQ(lookup(cfg, "q"), "w");
-    EXPECT_EQ(ZlvObjCfgIsFromFile(cfg), 1);
-}
-
-TEST_F(ZlvLogManager, FromFileDoesNotMarkAConfigurationThatWasThereBefore)
-{
-    ZlvObjCfg *cfg = get("a");
-    EXPECT_EQ(addFromFile("a", "p", "v"), 1);
-    EXPECT_EQ(ZlvObjCfgIsFromFile(cfg), 0);
-    EXPECT_EQ(lookup(cfg, "p"), "v");
-}
-
-TEST_F(ZlvLogManager, FromFileAcceptsAnEmptyValue)
-{
-    EXPECT_EQ(addFromFile("a", "p", ""), 1);
-    EXPECT_EQ(lookup(get("a"), "p"), "");
-}
-
-TEST_F(ZlvLogManager, FromFileRefusesNullArguments)
-{
-    EXPECT_EQ(addFromFile(nullptr, "p", "v"), 0);
-    EXPECT_EQ(addFromFile("a", nullptr, "v"), 0);
-    EXPECT_EQ(addFromFile("a", "p", nullptr), 0);
-    EXPECT_EQ(registered(), Names{});
-}
-
-TEST_F(ZlvLogManager, FromFileRefusesAnEmptyNameOrKey)
-{
-    EXPECT_EQ(addFromFile("", "p", "v"), 0);
-    EXPECT_EQ(addFromFile("a", "", "v"), 0);
-    EXPECT_EQ(registered(), Names{});
-}
-
-TEST_F(ZlvLogManager, FromFileRefusesTheRoot)
-{
-    EXPECT_EQ(addFromFile("/", "p", "v"), 0);
-    EXPECT_EQ(registered(), Names{});
-}
-
 TEST_F(ZlvLogManager, WithoutTheMutexNothingIsFoundOrMade)
 {
     get("a");
@@ -307,72 +245,6 @@ TEST_F(ZlvLogManager, WithoutTheMutexNothingIsApplied)
         EXPECT_EQ(ZlvLogMgrApplyCfg(object, "app"), 0);
     }
     EXPECT_EQ(prop(object, "p"), std::nullopt);
-}
-
-/// The registry's own life, without the toolkit around it.
-class ZlvLogManagerLife : public ToolkitFixture {};
-
-TEST_F(ZlvLogManagerLife, NothingIsThereBeforeItIsInitialised)
-{
-    EXPECT_EQ(ZLV_TK_LOG_MGR_INITIALIZED, 0);
-    EXPECT_EQ(ZlvLogMgrHasCfg("a"), 0);
-    EXPECT_EQ(ZlvLogMgrConfigNames(), nullptr);
-}
-
-TEST_F(ZlvLogManagerLife, InitMakesBothContainersOnce)
-{
-    HeldMutex held;
-    zlvInitLogMgr();
-    EXPECT_EQ(ZLV_TK_LOG_MGR_INITIALIZED, 1);
-    StringGroup *groupBefore = ZLV_TK_CFG_NAMES;
-    StringToObjCfgMap *mapBefore = ZLV_TK_CFG_DATA;
-    EXPECT_NE(groupBefore, nullptr);
-    EXPECT_NE(mapBefore, nullptr);
-    zlvInitLogMgr();
-    EXPECT_EQ(ZLV_TK_CFG_NAMES, groupBefore);
-    EXPECT_EQ(ZLV_TK_CFG_DATA, mapBefore);
-}
-
-TEST_F(ZlvLogManagerLife, InitWithoutMemoryLeavesNothing)
-{
-    HeldMutex held;
-    for (uint32_t allowed = 0; allowed < 2; ++allowed) {
-        FailAlloc fail(allowed);
-        zlvInitLogMgr();
-        EXPECT_EQ(fail.failed(), 1U);
-        EXPECT_EQ(ZLV_TK_LOG_MGR_INITIALIZED, 0);
-        EXPECT_EQ(ZLV_TK_CFG_NAMES, nullptr);
-        EXPECT_EQ(ZLV_TK_CFG_DATA, nullptr);
-    }
-}
-
-TEST_F(ZlvLogManagerLife, CloseReleasesEveryConfiguration)
-{
-    HeldMutex held;
-    zlvInitLogMgr();
-    ZlvObjCfg *cfg = zlvIntlLogMgrGetCfg("a");
-    zlvCloseLogMgr();
-    EXPECT_EQ(ZLV_TK_LOG_MGR_INITIALIZED, 0);
-    EXPECT_EQ(ZLV_TK_CFG_NAMES, nullptr);
-    EXPECT_EQ(ZLV_TK_CFG_DATA, nullptr);
-    EXPECT_EQ(cfg->refCount, 1U);
-    zlvIntlReleaseObjCfg(cfg);
-}
-
-TEST_F(ZlvLogManagerLife, CloseOfAClosedOneDoesNothing)
-{
-    HeldMutex held;
-    zlvCloseLogMgr();
-    EXPECT_EQ(ZLV_TK_LOG_MGR_INITIALIZED, 0);
-}
-
-TEST_F(ZlvLogManagerLife, CloseOfTheToolkitForgetsConfigurationsForTheNextOpen)
-{
-    open();
-    ZlvReleaseObjCfg(ZlvLogMgrGetCfg("a"));
-    close();
-    open();
-    EXPECT_EQ(ZlvLogMgrHasCfg("a"), 0);
 }
 
 } // namespace

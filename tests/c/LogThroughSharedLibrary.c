@@ -24,8 +24,8 @@ static void keep(ZlvObject *handler, ZlvEvent *event, va_list args)
 
 int main(void)
 {
-    static const UChar pattern[] = {'{', '0', ',', 'n', 'u', 'm', 'b', 'e', 'r', ',', 'i',
-                                    'n', 't', 'e', 'g', 'e', 'r', '}', '!', 0};
+    static const UChar pattern[] = {'{', '0', ',', 'n', 'u', 'm', 'b', 'e', 'r', ',',
+                                    'i', 'n', 't', 'e', 'g', 'e', 'r', '}', '!', 0};
     CxStatus status = {CX_STATUS_OK, 0};
     ZlvObject *logger;
     ZlvObject *handler;

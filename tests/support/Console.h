@@ -2,6 +2,8 @@
 // Sees what the process writes to its standard output, byte by byte, while it is being written.
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <cstdio>
 #include <string>
 
@@ -26,6 +28,8 @@ public:
     {
         std::fflush(stdout);
         dup2(previous_, STDOUT_FILENO);
+        if (testing::Test::HasFailure()) // whose report may have gone here too
+            std::fputs(seen().c_str(), stdout);
         ::close(previous_);
         ::close(capture_);
     }

@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-// The rules that every group family keeps: in both forms, and those of the public form alone.
+// The rules that every group family keeps, in its public and in its internal form alike.
 #pragma once
 
 #include <gtest/gtest.h>
 
 #include <string>
 
-#include "support/BrokenMutex.h"
 #include "support/Elements.h"
 #include "support/FailAlloc.h"
 
@@ -239,64 +238,5 @@ REGISTER_TYPED_TEST_SUITE_P(GroupRules, ANewGroupIsEmpty, AllocWithoutMemoryIsNu
                             IteratingVisitsEveryElementInOrder, GetLinkFindsTheNodeOfAnElement,
                             GetLinkOfAnAbsentElementIsNull, GetLinkOfANullGroupOrElementIsNull,
                             FreeIgnoresNull);
-
-template <class F>
-class PublicGroupRules : public GroupFixture<F> {
-};
-TYPED_TEST_SUITE_P(PublicGroupRules);
-
-TYPED_TEST_P(PublicGroupRules, WithoutTheMutexAllocGivesNull)
-{
-    BrokenMutex broken;
-    EXPECT_EQ(TypeParam::alloc(), nullptr);
-}
-
-TYPED_TEST_P(PublicGroupRules, WithoutTheMutexFreeDoesNothing)
-{
-    this->add("a");
-    BrokenMutex broken;
-    TypeParam::free(this->group);
-    EXPECT_EQ(this->contents(), "a");
-}
-
-TYPED_TEST_P(PublicGroupRules, WithoutTheMutexAddAndRemAreRefused)
-{
-    this->add("a");
-    BrokenMutex broken;
-    EXPECT_EQ(TypeParam::add(this->group, this->give('b')), 0);
-    EXPECT_EQ(TypeParam::rem(this->group, this->give('a')), 0);
-    EXPECT_EQ(this->contents(), "a");
-}
-
-TYPED_TEST_P(PublicGroupRules, WithoutTheMutexIteratorsGiveNothing)
-{
-    this->add("ab");
-    auto *first = this->group->first;
-    BrokenMutex broken;
-    EXPECT_EQ(TypeParam::iterator(this->group), nullptr);
-    EXPECT_EQ(TypeParam::hasNext(first), 0);
-    EXPECT_EQ(TypeParam::get(first), nullptr);
-    EXPECT_EQ(TypeParam::next(first), nullptr);
-}
-
-TYPED_TEST_P(PublicGroupRules, WithoutTheMutexIterRemRemovesNothing)
-{
-    this->add("ab");
-    BrokenMutex broken;
-    EXPECT_EQ(TypeParam::iterRem(this->group->first), nullptr);
-    EXPECT_EQ(this->contents(), "ab");
-}
-
-TYPED_TEST_P(PublicGroupRules, TheLinkLookupTakesNoMutex)
-{
-    this->add("ab");
-    BrokenMutex broken;
-    EXPECT_EQ(TypeParam::getLink(this->group, this->give('b')), this->group->last);
-}
-
-REGISTER_TYPED_TEST_SUITE_P(PublicGroupRules, WithoutTheMutexAllocGivesNull,
-                            WithoutTheMutexFreeDoesNothing, WithoutTheMutexAddAndRemAreRefused,
-                            WithoutTheMutexIteratorsGiveNothing,
-                            WithoutTheMutexIterRemRemovesNothing, TheLinkLookupTakesNoMutex);
 
 } // namespace zelvo_test

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "support/BrokenMutex.h"
-#include "support/MapRules.h"
+#include "support/MapWalkRules.h"
 
 namespace zelvo_test {
 

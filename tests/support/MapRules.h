@@ -269,100 +269,6 @@ TYPED_TEST_P(MapRules, ARemovedKeyComesBackAtTheEnd)
     EXPECT_EQ(this->contents(), "l=b m=c k=a ");
 }
 
-TYPED_TEST_P(MapRules, IteratingVisitsTheEntriesInTheOrderOfTheirFirstPut)
-{
-    this->putThree();
-    std::string seen;
-    for (auto at = TypeParam::iterator(this->map); TypeParam::hasNext(at) == 1;
-         at = TypeParam::next(at)) {
-        seen += taken(TypeParam::getKey(at)).value_or("(null)");
-        seen += this->took(TypeParam::getVal(at));
-    }
-    EXPECT_EQ(seen, "kalbmc");
-}
-
-TYPED_TEST_P(MapRules, IteratingAnEmptyOrNullMapEndsAtOnce)
-{
-    EXPECT_EQ(TypeParam::iterator(this->map), nullptr);
-    EXPECT_EQ(TypeParam::iterator(nullptr), nullptr);
-    EXPECT_EQ(TypeParam::hasNext(nullptr), 0);
-}
-
-TYPED_TEST_P(MapRules, ANullIteratorGivesNoKeyNoValueAndNoNext)
-{
-    EXPECT_EQ(TypeParam::getKey(nullptr), nullptr);
-    EXPECT_EQ(TypeParam::getVal(nullptr), nullptr);
-    EXPECT_EQ(TypeParam::next(nullptr), nullptr);
-}
-
-TYPED_TEST_P(MapRules, AnIteratedKeyIsACopy)
-{
-    this->put("k", 'a');
-    char *key = TypeParam::getKey(this->map->first);
-    EXPECT_NE(key, this->map->first->key);
-    EXPECT_EQ(taken(key), "k");
-}
-
-TYPED_TEST_P(MapRules, ACallerMayRemoveAnEntryAfterTakingTheNext)
-{
-    this->putThree();
-    auto next = TypeParam::next(TypeParam::iterator(this->map));
-    TypeParam::rem(this->map, "k");
-    EXPECT_EQ(taken(TypeParam::getKey(next)), "l");
-}
-
-TYPED_TEST_P(MapRules, ACopyHasTheSameEntriesInTheSameOrder)
-{
-    this->putThree();
-    auto *copy = TypeParam::copy(this->map);
-    EXPECT_EQ(this->contents(copy), "k=a l=b m=c ");
-    TypeParam::free(copy);
-    EXPECT_EQ(this->contents(), "k=a l=b m=c ");
-}
-
-TYPED_TEST_P(MapRules, ACopyHasKeysOfItsOwn)
-{
-    this->put("k", 'a');
-    auto *copy = TypeParam::copy(this->map);
-    EXPECT_NE(copy->first->key, this->map->first->key);
-    TypeParam::free(copy);
-}
-
-TYPED_TEST_P(MapRules, ACopyOfANullMapIsNull)
-{
-    EXPECT_EQ(TypeParam::copy(nullptr), nullptr);
-}
-
-TYPED_TEST_P(MapRules, ACopyOfAnEmptyMapIsEmpty)
-{
-    auto *copy = TypeParam::copy(this->map);
-    EXPECT_EQ(this->contents(copy), "");
-    TypeParam::free(copy);
-}
-
-TYPED_TEST_P(MapRules, CopyWithoutMemoryForTheMapIsNull)
-{
-    this->putThree();
-    FailAlloc fail(0);
-    EXPECT_EQ(TypeParam::copy(this->map), nullptr);
-}
-
-TYPED_TEST_P(MapRules, CopySkipsAnEntryWithoutMemoryForItsNode)
-{
-    this->putThree();
-    FailAlloc fail(1, FailAlloc::Once);
-    auto *copy = TypeParam::copy(this->map);
-    EXPECT_EQ(this->contents(copy), "l=b m=c ");
-    TypeParam::free(copy);
-}
-
-TYPED_TEST_P(MapRules, FreeIgnoresNull)
-{
-    this->put("k", 'a');
-    TypeParam::free(nullptr);
-    EXPECT_EQ(this->contents(), "k=a ");
-}
-
 REGISTER_TYPED_TEST_SUITE_P(
     MapRules, ANewMapIsEmpty, AllocWithoutMemoryIsNull, PutAppendsNewKeysAtTheEnd,
     PutOfAPresentKeyReplacesTheValueInItsPlace, PutKeepsACopyOfTheKey, PutRefusesANullMapOrKey,
@@ -373,11 +279,6 @@ REGISTER_TYPED_TEST_SUITE_P(
     HasKeyOfANullMapOrKeyIsFalse, RemOfTheOnlyEntryLeavesAnEmptyMap,
     RemOfTheFirstOfThreeLeavesTheOthers, RemOfTheMiddleOfThreeJoinsItsNeighbours,
     RemOfTheLastOfThreeLeavesTheOthers, RemOfAnAbsentKeyDoesNothing, RemOfANullMapOrKeyDoesNothing,
-    ARemovedKeyComesBackAtTheEnd, IteratingVisitsTheEntriesInTheOrderOfTheirFirstPut,
-    IteratingAnEmptyOrNullMapEndsAtOnce, ANullIteratorGivesNoKeyNoValueAndNoNext,
-    AnIteratedKeyIsACopy, ACallerMayRemoveAnEntryAfterTakingTheNext,
-    ACopyHasTheSameEntriesInTheSameOrder, ACopyHasKeysOfItsOwn, ACopyOfANullMapIsNull,
-    ACopyOfAnEmptyMapIsEmpty, CopyWithoutMemoryForTheMapIsNull,
-    CopySkipsAnEntryWithoutMemoryForItsNode, FreeIgnoresNull);
+    ARemovedKeyComesBackAtTheEnd);
 
 } // namespace zelvo_test

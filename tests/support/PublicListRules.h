@@ -7,7 +7,7 @@
 #include <functional>
 
 #include "support/BrokenMutex.h"
-#include "support/ListRules.h"
+#include "support/ListWalkRules.h"
 
 namespace zelvo_test {
 

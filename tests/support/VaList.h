@@ -3,16 +3,12 @@
 #pragma once
 
 #include <cstdarg>
-#include <type_traits>
+#include <cstddef>
 
 namespace zelvo_test {
 
-/// What a va_list becomes as a function's parameter.
-using VaListParm = std::decay_t<va_list>;
-static_assert(std::is_pointer_v<VaListParm>, "only here can an argument list be absent");
-
-/// No argument list at all.
-inline VaListParm noArgs()
+/// No argument list at all: where a va_list parameter is a pointer, as on x86-64, it can be null.
+inline std::nullptr_t noArgs()
 {
     return nullptr;
 }

@@ -11,32 +11,38 @@
 namespace zelvo_test {
 namespace {
 
-// One instance for each of the 256 bytes.
-class CxChars : public testing::TestWithParam<int> {
-protected:
-    int code() const { return GetParam(); }
-    char byte() const { return static_cast<char>(GetParam()); }
-    static bool within(int code, int first, int last) { return code >= first && code <= last; }
-};
-
-TEST_P(CxChars, AnASCIIDigitIs0x30To0x39)
+/// The bytes, out of all 256, for which a test holds.
+std::string bytesOf(ZlvBool (*test)(char))
 {
-    EXPECT_EQ(CxIsASCIIDigit(byte()), within(code(), 0x30, 0x39) ? 1 : 0);
+    std::string bytes;
+    for (int code = 0; code < 256; ++code)
+        if (test(static_cast<char>(code)) != 0)
+            bytes += static_cast<char>(code);
+    return bytes;
 }
 
-TEST_P(CxChars, AnASCIILetterIs0x41To0x5AOr0x61To0x7A)
+TEST(CxChars, AnASCIIDigitIs0x30To0x39)
 {
-    bool letter = within(code(), 0x41, 0x5A) || within(code(), 0x61, 0x7A);
-    EXPECT_EQ(CxIsASCIIAlpha(byte()), letter ? 1 : 0);
+    EXPECT_EQ(bytesOf(CxIsASCIIDigit), "\x30\x31\x32\x33\x34\x35\x36\x37\x38\x39");
 }
 
-TEST_P(CxChars, ALocalDigitIsOneOfTheTenDigitCharacters)
+TEST(CxChars, AnASCIILetterIs0x41To0x5AOr0x61To0x7A)
 {
-    bool digit = std::string("0123456789").find(byte()) != std::string::npos;
-    EXPECT_EQ(CxIsLocalDigit(byte()), digit ? 1 : 0);
+    EXPECT_EQ(bytesOf(CxIsASCIIAlpha), "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz");
 }
 
-INSTANTIATE_TEST_SUITE_P(EveryByte, CxChars, testing::Range(0, 256));
+TEST(CxChars, ALocalDigitIsOneOfTheTenDigitCharacters)
+{
+    EXPECT_EQ(bytesOf(CxIsLocalDigit), "0123456789");
+}
+
+TEST(CxChars, ATestAnswersWithZeroOrOne)
+{
+    EXPECT_EQ(CxIsASCIIDigit('7'), 1);
+    EXPECT_EQ(CxIsASCIIAlpha('x'), 1);
+    EXPECT_EQ(CxIsLocalDigit('0'), 1);
+    EXPECT_EQ(CxIsASCIIDigit('x'), 0);
+}
 
 TEST(CxETOA, LeavesEveryByteAsItIs)
 {
@@ -58,7 +64,6 @@ TEST(CxETOA, IgnoresANullBuffer)
 {
     CxETOA(nullptr, 0);
     CxETOA(nullptr, 8);
-    SUCCEED() << "returned";
 }
 
 struct CodePage {

@@ -34,7 +34,7 @@ TEST(CxStringBuff, The1024thByteDoublesTheStorage)
     Buff buff(std::string(1023, 'x').c_str());
     ASSERT_EQ(CxStringBuffAppendChar(&buff, 'y'), 1);
     EXPECT_EQ(buff.capacity, 2048U);
-    EXPECT_EQ(buff.text(), std::string(1023, 'x') + "y");
+    EXPECT_EQ(buff.text(), std::string(1023, 'x').append("y"));
     EXPECT_TRUE(buff.terminated());
 }
 

@@ -91,7 +91,7 @@ TEST(CxUStringToStdout, WritesTheTextAndALineFeed)
 
 TEST(CxUStringToStdout, WritesTextsOfAnyLength)
 {
-    EXPECT_EQ(printed(std::u16string(5000, u'x').c_str()), std::string(5000, 'x') + "\n");
+    EXPECT_EQ(printed(std::u16string(5000, u'x').c_str()), std::string(5000, 'x').append("\n"));
 }
 
 TEST(CxUStringToStdout, LeavesStandardOutputOpen)

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvListenerGroup.h"
 
-#include "support/GroupRules.h"
+#include "support/PublicGroupRules.h"
 
 namespace zelvo_test {
 namespace {

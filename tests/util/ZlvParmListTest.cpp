@@ -17,6 +17,7 @@ struct InternalParmList : ParmElements {
 
 using BothForms = testing::Types<PublicParmList, InternalParmList>;
 INSTANTIATE_TYPED_TEST_SUITE_P(ParmList, ListRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(ParmList, ListWalkRules, BothForms);
 using PublicForm = testing::Types<PublicParmList>;
 INSTANTIATE_TYPED_TEST_SUITE_P(ParmList, PublicListRules, PublicForm);
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvStringGroup.h"
 
-#include "support/GroupRules.h"
+#include "support/PublicGroupRules.h"
 #include "support/Text.h"
 
 namespace zelvo_test {

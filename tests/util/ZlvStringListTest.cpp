@@ -18,6 +18,7 @@ struct InternalStringList : StringElements {
 
 using BothForms = testing::Types<PublicStringList, InternalStringList>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringList, ListRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(StringList, ListWalkRules, BothForms);
 using PublicForm = testing::Types<PublicStringList>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringList, PublicListRules, PublicForm);
 

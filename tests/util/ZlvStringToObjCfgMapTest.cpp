@@ -19,6 +19,7 @@ using BothForms = testing::Types<PublicStringToObjCfgMap, InternalStringToObjCfg
 using PublicForm = testing::Types<PublicStringToObjCfgMap>;
 using InternalForm = testing::Types<InternalStringToObjCfgMap>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjCfgMap, MapRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjCfgMap, MapWalkRules, BothForms);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjCfgMap, PublicMapRules, PublicForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjCfgMap, InternalMapRules, InternalForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjCfgMap, CountedMapRules, BothForms);

@@ -19,6 +19,7 @@ using BothForms = testing::Types<PublicStringToObjClassMap, InternalStringToObjC
 using PublicForm = testing::Types<PublicStringToObjClassMap>;
 using InternalForm = testing::Types<InternalStringToObjClassMap>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjClassMap, MapRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjClassMap, MapWalkRules, BothForms);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjClassMap, PublicMapRules, PublicForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjClassMap, InternalMapRules, InternalForm);
 

@@ -19,6 +19,7 @@ using BothForms = testing::Types<PublicStringToObjMap, InternalStringToObjMap>;
 using PublicForm = testing::Types<PublicStringToObjMap>;
 using InternalForm = testing::Types<InternalStringToObjMap>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjMap, MapRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjMap, MapWalkRules, BothForms);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjMap, PublicMapRules, PublicForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjMap, InternalMapRules, InternalForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToObjMap, CountedMapRules, BothForms);

@@ -19,6 +19,7 @@ using BothForms = testing::Types<PublicStringToStringMap, InternalStringToString
 using PublicForm = testing::Types<PublicStringToStringMap>;
 using InternalForm = testing::Types<InternalStringToStringMap>;
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToStringMap, MapRules, BothForms);
+INSTANTIATE_TYPED_TEST_SUITE_P(StringToStringMap, MapWalkRules, BothForms);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToStringMap, PublicMapRules, PublicForm);
 INSTANTIATE_TYPED_TEST_SUITE_P(StringToStringMap, InternalMapRules, InternalForm);
 

@@ -1,0 +1,87 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "support/NullCallWorld.h"
+
+#include "ZlvIntl.h"
+
+namespace zelvo_test {
+namespace {
+
+const char *classOf(Kind kind)
+{
+    switch (kind) {
+    case Kind::Filter:
+        return "zlv_levelfilter";
+    case Kind::Handler:
+        return "zlv_consolehandler";
+    case Kind::Formatter:
+        return "zlv_basicformatter";
+    default:
+        return "zlv_basiclogger";
+    }
+}
+
+} // namespace
+
+NullCallWorld::NullCallWorld(Kind kind)
+{
+    ZlvOpenToolkit(nullptr, nullptr);
+    object_ = ZlvGetObject("sample", classOf(kind));
+    cfg_ = ZlvLogMgrGetCfg("cfg");
+    event_ = ZlvVaAllocUEvent(ZLV_LEVEL_INFO, nullptr, nullptr, u"text", noArgs());
+    parm_.type = ZLV_PARM_INT;
+    CxMutexCreate(&mutex_);
+    CxDirectoryOpen(&directory_, ".");
+    CxInitFilePath(&path_, "sample");
+    CxStringBuffAppendStr(&buff_, "sample");
+    CxUStringBuffAppendStr(&wideBuff_, "sample");
+    CxPropListPutStr(&props_, "sample", "value");
+    propsAt_ = CxPropListIterator(&props_);
+    ZlvStrTokIterator(&tokens_, "one two", " ");
+    ZlvStringListAppend(strings_ = ZlvAllocStringList(), "sample");
+    ZlvParmListAppend(parms_ = ZlvAllocParmList(), &parm_);
+    ZlvStringGroupAdd(names_ = ZlvAllocStringGroup(), "sample");
+    ZlvListenerGroupAdd(listeners_ = ZlvAllocListenerGroup(), object_);
+    ZlvStringToStringMapPut(texts_ = ZlvAllocStringToStringMap(), "sample", "5");
+    ZlvStringToObjMapPut(objects_ = ZlvAllocStringToObjMap(), "sample", object_);
+    ZlvStringToObjCfgMapPut(cfgs_ = ZlvAllocStringToObjCfgMap(), "sample", cfg_);
+    ZlvStringToObjClassMapPut(classes_ = ZlvAllocStringToObjClassMap(), "sample",
+                              object_->objClass);
+}
+
+NullCallWorld::~NullCallWorld()
+{
+    if (thread_ != 0)
+        CxThreadJoin(thread_);
+    ZlvFreeStringList(strings_);
+    ZlvFreeParmList(parms_);
+    ZlvFreeStringGroup(names_);
+    ZlvFreeListenerGroup(listeners_);
+    ZlvFreeStringToStringMap(texts_);
+    ZlvFreeStringToObjMap(objects_);
+    ZlvFreeStringToObjCfgMap(cfgs_);
+    ZlvFreeStringToObjClassMap(classes_);
+    CxStringBuffDiscard(&buff_);
+    CxUStringBuffDiscard(&wideBuff_);
+    CxPropListDiscard(&props_);
+    CxDirectoryClose(&directory_);
+    CxMutexDestroy(&mutex_);
+    ZlvFreeEvent(event_);
+    ZlvReleaseObjCfg(cfg_);
+    ZlvReleaseObject(object_);
+    ZlvCloseToolkit();
+}
+
+void release(const volatile void *result, char answer)
+{
+    void *mine = const_cast<void *>(result);
+    if (answer == 'f')
+        RkoMemoryFree(mine);
+    else if (answer == 'o')
+        ZlvReleaseObject(static_cast<ZlvObject *>(mine));
+    else if (answer == 'v')
+        ZlvFreeEvent(static_cast<ZlvEvent *>(mine));
+    else if (answer == 'm')
+        ZlvFreeI18Msg(static_cast<ZlvI18Msg *>(mine));
+}
+
+} // namespace zelvo_test
