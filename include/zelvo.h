@@ -90,6 +90,7 @@
 #include "CxDirectory.h"
 #include "CxFile.h"
 #include "CxFilePath.h"
+#include "CxKvtID.h"
 #include "CxListUtil.h"
 #include "CxMemory.h"
 #include "CxMutex.h"
@@ -116,10 +117,13 @@
 #include "ZlvLogManager.h"
 #include "ZlvLogger.h"
 #include "ZlvMisc.h"
+#include "ZlvMsgIdFilter.h"
 #include "ZlvMultiProcFileHandler.h"
 #include "ZlvObjClass.h"
 #include "ZlvObjConfig.h"
 #include "ZlvObject.h"
+#include "ZlvPDLogger.h"
+#include "ZlvPDXMLFormatter.h"
 #include "ZlvParm.h"
 #include "ZlvParmList.h"
 #include "ZlvProps.h"
@@ -131,5 +135,6 @@
 #include "ZlvStringToObjMap.h"
 #include "ZlvStringToStringMap.h"
 #include "ZlvToolkit.h"
+#include "ZlvVyxTraceFormatter.h"
 
 #endif

@@ -8,12 +8,10 @@
 #include <unicode/udat.h>
 #include <unicode/ustring.h>
 
-#include "CxMemory.h"
 #include "CxString.h"
 #include "CxUString.h"
-#include "CxUStringBuff.h"
 #include "ZlvIcuText.h"
-#include "ZlvIntl.h"
+#include "ZlvRecord.h"
 #include "util/CxOwned.h"
 
 using namespace zelvo;
@@ -26,35 +24,6 @@ constexpr int32_t MILLISECONDS_PER_HOUR = 60 * MILLISECONDS_PER_MINUTE;
 constexpr const char *PROPERTIES_BEFORE_LINE[] = {"zlv_prop_srcfile", "zlv_prop_srcfunction"};
 constexpr const char *PROPERTIES_AFTER_LINE[] = {"organization", "product", "component", "client",
                                                  "server"};
-
-/// A record under construction: fields, each followed by the separator, then text.
-class Record {
-public:
-    explicit Record(const char *separator) : separator_(separator != nullptr ? separator : " ") {}
-    Record(const Record &) = delete;
-    Record &operator=(const Record &) = delete;
-    ~Record() { CxUStringBuffDiscard(&text_); }
-
-    void addField(const UChar *field)
-    {
-        add(field);
-        CxUStringBuffAppendStr(&text_, separator_);
-    }
-
-    void addField(const char *field)
-    {
-        CxUStringBuffAppendStr(&text_, field);
-        CxUStringBuffAppendStr(&text_, separator_);
-    }
-
-    void add(const UChar *text) { CxUStringBuffAppendUStr(&text_, text); }
-
-    UChar *take() { return CxUStringBuffTakeUStr(&text_); }
-
-private:
-    CxUStringBuff text_{};
-    const char *separator_;
-};
 
 /// The setting that a property configures; null for any other property.
 char **settingOf(ZlvObject *formatter, const char *propertyName)
@@ -76,22 +45,18 @@ ZlvFBindMsg bindEntryOf(const ZlvObject *formatter)
     return isFormatter ? objClass->formatter.fBindMsg : nullptr;
 }
 
-void addProperty(Record &record, const ZlvEvent *event, const char *property)
+/// Ends a field.
+void separate(CxUStringBuff *out, const ZlvObject *formatter)
 {
-    const OwnedStr value{ZlvGetEventProp(event, property, nullptr)};
-    if (value)
-        record.addField(value.get());
+    const char *separator = formatter->formatter.separator;
+    CxUStringBuffAppendStr(out, separator != nullptr ? separator : " ");
 }
 
-void addSourceLine(Record &record, const ZlvEvent *event)
+void addField(CxUStringBuff *out, const ZlvObject *formatter, const ZlvEvent *event,
+              const char *property)
 {
-    ZlvBool found = 0;
-    const int32_t line = ZlvGetEventPropInt(event, "zlv_prop_srcline", &found);
-    if (found == 0)
-        return;
-    char digits[12];
-    static_cast<void>(std::snprintf(digits, sizeof digits, "%d", line));
-    record.addField(digits);
+    if (appendProperty(out, event, property))
+        separate(out, formatter);
 }
 
 /// A time as ICU writes it by a pattern; null if it cannot, or if nothing comes out.
@@ -123,7 +88,7 @@ int32_t zoneOffset(UDate time)
     return U_SUCCESS(status) ? offset : 0;
 }
 
-void addZoneSuffix(Record &record, UDate time)
+void addZoneSuffix(CxUStringBuff *out, UDate time)
 {
     const int32_t offset = zoneOffset(time);
     const int32_t hours = offset / MILLISECONDS_PER_HOUR;
@@ -134,7 +99,7 @@ void addZoneSuffix(Record &record, UDate time)
                            : std::snprintf(suffix, sizeof suffix, "+%02d:%02d", hours, minutes);
     UChar wide[sizeof suffix];
     u_charsToUChars(suffix, wide, length + 1);
-    record.add(wide);
+    CxUStringBuffAppendUStr(out, wide);
 }
 
 UChar *defaultDate(UDate time)
@@ -142,10 +107,10 @@ UChar *defaultDate(UDate time)
     const OwnedUStr date{rendered(u"yyyy-MM-dd HH:mm:ss.SSS", time)};
     if (!date)
         return nullptr;
-    Record text{nullptr};
-    text.add(date.get());
-    addZoneSuffix(text, time);
-    return text.take();
+    Record whole;
+    CxUStringBuffAppendUStr(whole.text(), date.get());
+    addZoneSuffix(whole.text(), time);
+    return whole.take();
 }
 
 UChar *configuredDate(const char *setting, UDate time)
@@ -172,19 +137,20 @@ UChar *ZlvBasicUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_list 
     const ZlvFBindMsg bind = bindEntryOf(formatter);
     if (event == nullptr || bind == nullptr)
         return nullptr;
-    Record record{formatter->formatter.separator};
+    Record record;
+    CxUStringBuff *out = record.text();
     const OwnedUStr date{ZlvBasicUFormatterFormatDate(formatter, ZlvGetEventTime(event))};
-    record.addField(date.get());
+    CxUStringBuffAppendUStr(out, date.get());
+    separate(out, formatter);
     for (const char *property : PROPERTIES_BEFORE_LINE)
-        addProperty(record, event, property);
-    addSourceLine(record, event);
+        addField(out, formatter, event, property);
+    if (appendNumber(out, event, "zlv_prop_srcline", appendSigned))
+        separate(out, formatter);
     for (const char *property : PROPERTIES_AFTER_LINE)
-        addProperty(record, event, property);
-    if (formatter->formatter.locale != nullptr)
-        zlvSetEventLocale(event, formatter->formatter.locale);
-    const OwnedUStr message{ZlvBindEventUMsg(event, bind, args)};
-    record.add(message.get());
-    record.add(u"\n");
+        addField(out, formatter, event, property);
+    const OwnedUStr message{boundMessage(formatter, event, bind, args)};
+    CxUStringBuffAppendUStr(out, message.get());
+    CxUStringBuffAppendUStr(out, u"\n");
     return record.take();
 }
 

@@ -6,7 +6,11 @@
 #include "ZlvFileHandler.h"
 #include "ZlvIntl.h"
 #include "ZlvLevelFilter.h"
+#include "ZlvMsgIdFilter.h"
 #include "ZlvMultiProcFileHandler.h"
+#include "ZlvPDLogger.h"
+#include "ZlvPDXMLFormatter.h"
+#include "ZlvVyxTraceFormatter.h"
 
 namespace {
 
@@ -24,6 +28,14 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvBasicLoggerFCfgChange}},
+    {"zlv_pdlogger",
+     {.kind = ZLV_KIND_LOGGER,
+      .name = nullptr,
+      .description = nullptr,
+      .logger = {.fLog = ZlvPDLoggerFLog},
+      .fAllocVars = ZlvPDLoggerFAllocVars,
+      .fFreeVars = ZlvPDLoggerFFreeVars,
+      .fCfgChange = ZlvPDLoggerFCfgChange}},
     {"zlv_levelfilter",
      {.kind = ZLV_KIND_FILTER,
       .name = nullptr,
@@ -34,6 +46,16 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvLevelFilterFCfgChange}},
+    {"zlv_msgidfilter",
+     {.kind = ZLV_KIND_FILTER,
+      .name = nullptr,
+      .description = nullptr,
+      .filter = {.fProcess = ZlvBasicFilterFProcess,
+                 .fIsLoggable = ZlvMsgIdFilterFIsLoggable,
+                 .fLog = ZlvBasicObjectFLog},
+      .fAllocVars = ZlvMsgIdFilterFAllocVars,
+      .fFreeVars = ZlvMsgIdFilterFFreeVars,
+      .fCfgChange = ZlvMsgIdFilterFCfgChange}},
     {"zlv_consolehandler",
      {.kind = ZLV_KIND_HANDLER,
       .name = nullptr,
@@ -75,6 +97,28 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = nullptr,
       .fFreeVars = nullptr,
       .fCfgChange = ZlvBasicFormatterFCfgChange}},
+    {"zlv_xmlformatter",
+     {.kind = ZLV_KIND_FORMATTER,
+      .name = nullptr,
+      .description = nullptr,
+      .formatter = {.fFormat = ZlvPDXMLUFormatterFFormat,
+                    .fGetHeader = ZlvPDXMLFormatterFGetHeader,
+                    .fGetTrailer = ZlvPDXMLFormatterFGetTrailer,
+                    .fBindMsg = zlvIntlBindUI18Msg},
+      .fAllocVars = ZlvPDXMLFormatterFAllocVars,
+      .fFreeVars = ZlvPDXMLFormatterFFreeVars,
+      .fCfgChange = ZlvPDXMLFormatterFCfgChange}},
+    {"zlv_vyxtraceformatter",
+     {.kind = ZLV_KIND_FORMATTER,
+      .name = nullptr,
+      .description = nullptr,
+      .formatter = {.fFormat = ZlvVyxTraceUFormatterFFormat,
+                    .fGetHeader = ZlvBasicFormatterFGetHeader,
+                    .fGetTrailer = ZlvBasicFormatterFGetTrailer,
+                    .fBindMsg = zlvIntlBindUI18Msg},
+      .fAllocVars = nullptr,
+      .fFreeVars = nullptr,
+      .fCfgChange = nullptr}},
 };
 
 } // namespace

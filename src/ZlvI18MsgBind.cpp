@@ -9,10 +9,9 @@
 
 #include <unicode/uchar.h>
 #include <unicode/umsg.h>
-#include <unicode/ures.h>
 #include <unicode/ustring.h>
 
-#include "CxString.h"
+#include "ZlvBundlePattern.h"
 #include "ZlvIcuText.h"
 #include "ZlvOwned.h"
 
@@ -21,41 +20,6 @@ namespace {
 
 /// How many arguments a list of zeros can answer for.
 constexpr int64_t ZERO_ARGUMENTS = 64;
-
-/// The pattern of a key in a resource bundle, for as long as the bundle is open.
-class BundlePattern {
-public:
-    BundlePattern(const ZlvI18Msg *message, UErrorCode *status)
-        : bundle_(open(message->bundle, message->locale, status)),
-          pattern_(find(bundle_, message->key, status))
-    {
-    }
-    BundlePattern(const BundlePattern &) = delete;
-    BundlePattern &operator=(const BundlePattern &) = delete;
-    ~BundlePattern() { ures_close(bundle_); }
-
-    const UChar *get() const { return pattern_; }
-
-private:
-    static UResourceBundle *open(const char *name, const char *locale, UErrorCode *status)
-    {
-        UResourceBundle *bundle = ures_open(name, locale, status);
-        const char *slash = U_FAILURE(*status) ? RkoStringRChr(name, '/') : nullptr;
-        if (slash == nullptr)
-            return bundle;
-        *status = U_ZERO_ERROR;
-        return ures_open(slash + 1, locale, status);
-    }
-
-    static const UChar *find(UResourceBundle *bundle, const char *key, UErrorCode *status)
-    {
-        int32_t length = 0;
-        return ures_getStringByKey(bundle, key, &length, status);
-    }
-
-    UResourceBundle *bundle_;
-    const UChar *pattern_;
-};
 
 UChar *formatted(ZlvI18Msg *message, const UChar *pattern, va_list args)
 {

@@ -1,20 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 // The tokens of a byte string.
-#include "ZlvStrTok.h"
+#include "ZlvStrTokIntl.h"
 
 #include <cstring>
 
 #include "CxMemory.h"
 
-namespace {
+using namespace zelvo;
 
-struct Token {
-    const char *start;
-    size_t length;
-};
-
-/// The next token; of length 0, at the place where the search ended, when there is none.
-Token nextToken(ZlvStrTokIter iterator)
+Token zelvo::nextToken(ZlvStrTokIter iterator)
 {
     if (iterator.position == nullptr || *iterator.position == '\0')
         return {iterator.position, 0};
@@ -23,6 +17,8 @@ Token nextToken(ZlvStrTokIter iterator)
     const char *start = iterator.position + std::strspn(iterator.position, iterator.delimiters);
     return {start, std::strcspn(start, iterator.delimiters)};
 }
+
+namespace {
 
 char *copyOf(Token token)
 {

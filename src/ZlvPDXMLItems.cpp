@@ -1,0 +1,72 @@
+// SPDX-License-Identifier: Apache-2.0
+// Pieces of an XML record that come from the event's level and properties.
+#include "CxString.h"
+#include "ZlvLevelWords.h"
+#include "ZlvPDXMLFormatter.h"
+#include "ZlvRecord.h"
+#include "util/CxOwned.h"
+
+using namespace zelvo;
+
+namespace {
+
+/// Properties that have an element of their own.
+constexpr const char *placedProperties[] = {
+    "threadId",         "correlationId",    "client",
+    "zlv_prop_srcfile", "zlv_prop_srcline", "zlv_prop_srcfunction",
+    "server",           "serverFormat",     "product",
+    "component",        "productInstance",  "processId",
+};
+
+void addServer(CxUStringBuff *out, const ZlvEvent *event)
+{
+    const OwnedStr server{ZlvGetEventProp(event, "server", nullptr)};
+    if (!server)
+        return;
+    CxUStringBuffAppendUStr(out, u" <Server Format=\"");
+    appendProperty(out, event, "serverFormat");
+    CxUStringBuffAppendUStr(out, u"\">");
+    CxUStringBuffAppendStr(out, server.get());
+    CxUStringBuffAppendUStr(out, u"</Server>\n");
+}
+
+} // namespace
+
+ZlvBool zlvPDXMLCheckKey(const char *key)
+{
+    if (key == nullptr)
+        return 0;
+    for (const char *placed : placedProperties)
+        if (RkoStringCmp(key, placed) == 0)
+            return 0;
+    return 1;
+}
+
+void zlvPDXMLEmitULevel(CxUStringBuff *buff, ZlvLevel level)
+{
+    CxUStringBuffAppendUStr(buff, wordsOf(level).word);
+}
+
+void zlvPDXMLEmitUProductInfo(CxUStringBuff *buff, const ZlvEvent *event, ZlvBool server,
+                              ZlvBool product, ZlvBool component, ZlvBool productInstance)
+{
+    if (server != 0)
+        addServer(buff, event);
+    if (product != 0)
+        appendProperty(buff, event, "product", u" <ProductId>", u"</ProductId>\n");
+    if (component != 0)
+        appendProperty(buff, event, "component", u" <Component>", u"</Component>\n");
+    if (productInstance != 0)
+        appendProperty(buff, event, "productInstance", u" <ProductInstance>",
+                       u"</ProductInstance>\n");
+}
+
+ZlvBool zlvPDXMLEmitUSource(CxUStringBuff *buff, const ZlvEvent *event)
+{
+    if (!appendProperty(buff, event, "zlv_prop_srcfile", u" <Source FileName=\""))
+        return 0;
+    appendProperty(buff, event, "zlv_prop_srcfunction", u"\" Method=\"");
+    appendNumber(buff, event, "zlv_prop_srcline", appendSigned, u"\" Line=\"");
+    CxUStringBuffAppendUStr(buff, u"\"/>\n");
+    return 1;
+}

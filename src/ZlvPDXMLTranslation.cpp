@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: Apache-2.0
+// The piece of an XML record that lets a reader translate the message: where its pattern comes
+// from, and the arguments to put into it.
+#include "ZlvBundlePattern.h"
+#include "ZlvPDXMLFormatter.h"
+#include "ZlvPatternScan.h"
+#include "ZlvRecord.h"
+#include "util/CxOwned.h"
+
+using namespace zelvo;
+
+namespace {
+
+/// Takes the next argument from the list; a null text shows as nothing.
+void addArgument(CxUStringBuff *out, ArgKind kind, ArgList &args)
+{
+    if (kind == ArgKind::TEXT)
+        CxUStringBuffAppendUStr(out, va_arg(args.list, const UChar *));
+    else if (kind == ArgKind::INTEGER)
+        appendSigned(out, va_arg(args.list, int32_t));
+    else
+        CxUStringBuffAppendUDouble(out, va_arg(args.list, double));
+}
+
+void addArguments(CxUStringBuff *out, const ArgKinds &kinds, va_list args)
+{
+    ArgList own{args};
+    for (const ArgKind kind : kinds.of) {
+        if (kind == ArgKind::ABSENT)
+            return;
+        CxUStringBuffAppendUStr(out, u"<Param><![CDATA[");
+        addArgument(out, kind, own);
+        CxUStringBuffAppendUStr(out, u"]]></Param>");
+    }
+}
+
+/// Shows the arguments of the message's pattern, if that can be had. A list is touched only for a
+/// pattern that has arguments to show.
+void addArguments(CxUStringBuff *out, const ZlvI18Msg *message, va_list args)
+{
+    UErrorCode status = U_ZERO_ERROR;
+    const BundlePattern pattern{message, &status};
+    if (U_FAILURE(status) || isAbsent(args))
+        return;
+    const ArgKinds kinds = fetchableKinds(pattern.get());
+    if (kinds.of[0] != ArgKind::ABSENT)
+        addArguments(out, kinds, args);
+}
+
+} // namespace
+
+void zlvPDXMLEmitUTranslationInfo(CxUStringBuff *buff, const ZlvEvent *event, va_list args)
+{
+    const ZlvI18Msg *message = event != nullptr ? event->message : nullptr;
+    if (message == nullptr || message->bundle == nullptr || message->key == nullptr)
+        return;
+    // "Resource Bundle", with its blank, is the attribute's name to all readers of these records.
+    CxUStringBuffAppendUStr(buff, u" <TranslationInfo Resource Bundle=\"");
+    CxUStringBuffAppendStr(buff, message->bundle);
+    CxUStringBuffAppendUStr(buff, u"\" MsgKey=\"");
+    CxUStringBuffAppendStr(buff, message->key);
+    CxUStringBuffAppendUStr(buff, u"\">");
+    addArguments(buff, message, args);
+    CxUStringBuffAppendUStr(buff, u"</TranslationInfo>\n");
+}
