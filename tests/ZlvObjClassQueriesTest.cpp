@@ -47,14 +47,22 @@ TEST_P(ZlvObjClassQuery, ItsTwinGivesTheSame)
 
 INSTANTIATE_TEST_SUITE_P(
     , ZlvObjClassQuery,
-    testing::Values(
-        Query{"logger", ZlvGetLoggerClasses, zlvIntlGetLoggerClasses, {"zlv_basiclogger"}},
-        Query{"filter", ZlvGetFilterClasses, zlvIntlGetFilterClasses, {"zlv_levelfilter"}},
-        Query{"handler", ZlvGetHandlerClasses, zlvIntlGetHandlerClasses, {"zlv_consolehandler"}},
-        Query{"formatter",
-              ZlvGetFormatterClasses,
-              zlvIntlGetFormatterClasses,
-              {"zlv_basicformatter"}}),
+    testing::Values(Query{"logger",
+                          ZlvGetLoggerClasses,
+                          zlvIntlGetLoggerClasses,
+                          {"zlv_basiclogger", "zlv_pdlogger"}},
+                    Query{"filter",
+                          ZlvGetFilterClasses,
+                          zlvIntlGetFilterClasses,
+                          {"zlv_levelfilter", "zlv_msgidfilter"}},
+                    Query{"handler",
+                          ZlvGetHandlerClasses,
+                          zlvIntlGetHandlerClasses,
+                          {"zlv_consolehandler", "zlv_filehandler", "zlv_multiproc_filehandler"}},
+                    Query{"formatter",
+                          ZlvGetFormatterClasses,
+                          zlvIntlGetFormatterClasses,
+                          {"zlv_basicformatter", "zlv_xmlformatter", "zlv_vyxtraceformatter"}}),
     [](const auto &row) { return std::string(row.param.name); });
 
 } // namespace

@@ -8,16 +8,11 @@ namespace {
 
 const char *classOf(Kind kind)
 {
-    switch (kind) {
-    case Kind::Filter:
-        return "zlv_levelfilter";
-    case Kind::Handler:
-        return "zlv_consolehandler";
-    case Kind::Formatter:
-        return "zlv_basicformatter";
-    default:
-        return "zlv_basiclogger";
-    }
+    static constexpr const char *CLASSES[] = {
+        "zlv_basiclogger",  "zlv_levelfilter",           "zlv_consolehandler", "zlv_basicformatter",
+        "zlv_filehandler",  "zlv_multiproc_filehandler", "zlv_msgidfilter",    "zlv_pdlogger",
+        "zlv_xmlformatter", "zlv_vyxtraceformatter"};
+    return CLASSES[static_cast<size_t>(kind)];
 }
 
 } // namespace
@@ -82,6 +77,8 @@ void release(const volatile void *result, char answer)
         ZlvFreeEvent(static_cast<ZlvEvent *>(mine));
     else if (answer == 'm')
         ZlvFreeI18Msg(static_cast<ZlvI18Msg *>(mine));
+    else if (answer == 's')
+        ZlvFreeStringList(static_cast<StringList *>(mine));
 }
 
 } // namespace zelvo_test

@@ -173,4 +173,40 @@ std::vector<NullCall> toolkitNullCalls()
     };
 }
 
+std::vector<NullCall> classNullCalls()
+{
+    return {
+        CALL(CxParseKvtID, "0"),
+        CALL_OF(FileHandler, ZlvFileHandlerFAllocVars, ""),
+        CALL_OF(FileHandler, ZlvFileHandlerFCfgChange, ".."),
+        CALL_OF(FileHandler, ZlvFileHandlerFClose, "."),
+        CALL_OF(FileHandler, ZlvFileHandlerFFreeVars, "."),
+        CALL_OF(FileHandler, ZlvFileHandlerFOpen, "."),
+        CALL_OF(FileHandler, ZlvFileHandlerFOpenWithErr, "-"),
+        CALL_OF(FileHandler, ZlvFileUHandlerFProcess, "..."),
+        CALL_OF(MsgIdFilter, ZlvMsgIdFilterFAllocVars, ""),
+        CALL_OF(MsgIdFilter, ZlvMsgIdFilterFCfgChange, ".."),
+        CALL_OF(MsgIdFilter, ZlvMsgIdFilterFFreeVars, "."),
+        CALL_OF(MsgIdFilter, ZlvMsgIdFilterFIsLoggable, "001"),
+        CALL(ZlvMsgIdFilterGetStringList, "s"),
+        CALL(ZlvMsgIdFilterMatchMsgId, "00"),
+        CALL_OF(SharedFileHandler, ZlvMultiProcFileHandlerFClose, "."),
+        CALL_OF(SharedFileHandler, ZlvMultiProcFileHandlerFOpen, "."),
+        CALL_OF(SharedFileHandler, ZlvMultiProcFileHandlerFOpenWithErr, "-"),
+        CALL_OF(SharedFileHandler, ZlvMultiProcFileUHandlerFProcess, "..."),
+        CALL_OF(PDLogger, ZlvPDLoggerFAllocVars, ""),
+        CALL_OF(PDLogger, ZlvPDLoggerFCfgChange, ".."),
+        CALL_OF(PDLogger, ZlvPDLoggerFFreeVars, "."),
+        CALL_OF(PDLogger, ZlvPDLoggerFLog, "..."),
+        CALL_OF(XmlFormatter, ZlvPDXMLFormatterFAllocVars, ""),
+        CALL_OF(XmlFormatter, ZlvPDXMLFormatterFCfgChange, ".."),
+        CALL_OF(XmlFormatter, ZlvPDXMLFormatterFFreeVars, "."),
+        CALL_OF(XmlFormatter, ZlvPDXMLFormatterFGetHeader, "0"),
+        CALL_OF(XmlFormatter, ZlvPDXMLFormatterFGetTrailer, "0"),
+        CALL_OF(XmlFormatter, ZlvPDXMLUFormatterFFormat, "00f"),
+        CALL(ZlvPatternMatch, "00"),
+        CALL_OF(TraceFormatter, ZlvVyxTraceUFormatterFFormat, "00f"),
+    };
+}
+
 } // namespace zelvo_test
