@@ -9,6 +9,14 @@ namespace {
 const char *classOf(Kind kind)
 {
     switch (kind) {
+    case Kind::PDLogger:
+        return "zlv_pdlogger";
+    case Kind::MsgIdFilter:
+        return "zlv_msgidfilter";
+    case Kind::XMLFormatter:
+        return "zlv_xmlformatter";
+    case Kind::TraceFormatter:
+        return "zlv_vyxtraceformatter";
     case Kind::Filter:
         return "zlv_levelfilter";
     case Kind::Handler:
@@ -82,6 +90,8 @@ void release(const volatile void *result, char answer)
         ZlvFreeEvent(static_cast<ZlvEvent *>(mine));
     else if (answer == 'm')
         ZlvFreeI18Msg(static_cast<ZlvI18Msg *>(mine));
+    else if (answer == 's')
+        ZlvFreeStringList(static_cast<StringList *>(mine));
 }
 
 } // namespace zelvo_test

@@ -9,7 +9,8 @@
 #include "zelvo.h"
 
 #if !defined(__clang__)
-// An argument list has attributes that no template parameter carries, and none of them matters here.
+// An argument list has attributes that no template parameter carries, and none of them matters
+// here.
 #pragma GCC diagnostic ignored "-Wattributes"
 #pragma GCC diagnostic ignored "-Wignored-attributes"
 #endif
@@ -21,8 +22,17 @@ using VaListParameter = decltype([](va_list args) {
     return args;
 }(*static_cast<va_list *>(nullptr)));
 
-/// The kind of the object that a call gets.
-enum class Kind { Logger, Filter, Handler, Formatter };
+/// The kind of the object that a call gets; those of its own class where that has variables.
+enum class Kind {
+    Logger,
+    PDLogger,
+    Filter,
+    MsgIdFilter,
+    Handler,
+    Formatter,
+    XMLFormatter,
+    TraceFormatter
+};
 
 /// An open toolkit with one of everything.
 class NullCallWorld {
