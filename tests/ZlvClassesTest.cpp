@@ -8,6 +8,10 @@
 #include "ZlvHandler.h"
 #include "ZlvIntl.h"
 #include "ZlvLevelFilter.h"
+#include "ZlvMsgIdFilter.h"
+#include "ZlvPDLogger.h"
+#include "ZlvPDXMLFormatter.h"
+#include "ZlvVyxTraceFormatter.h"
 
 namespace zelvo_test {
 namespace {
@@ -70,7 +74,7 @@ TEST_F(ZlvClasses, AddingAClassUnderANullNameRegistersNothingAndFreesIt)
     zlvToolkitInitObjClasses();
     zlvToolkitAddClassDef(nullptr, record("mine", ZLV_KIND_LOGGER));
     EXPECT_EQ(zlvToolkitGetClassDef("mine"), nullptr);
-    EXPECT_EQ(namesOf(ZLV_KIND_LOGGER), Names{"zlv_basiclogger"});
+    EXPECT_EQ(namesOf(ZLV_KIND_LOGGER), (Names{"zlv_basiclogger", "zlv_pdlogger"}));
 }
 
 TEST_F(ZlvClasses, AnUnknownKindIsRegisteredButListedNowhere)
@@ -239,10 +243,19 @@ TEST_P(ZlvBuiltin, HasTheEntriesOfItsKind)
 const Builtin builtins[] = {
     {"zlv_basiclogger", ZLV_KIND_LOGGER, nullptr, nullptr, ZlvBasicLoggerFCfgChange,
      [](const ZlvObjClass *c) { return c->logger.fLog == ZlvBasicObjectFLog; }},
+    {"zlv_pdlogger", ZLV_KIND_LOGGER, ZlvPDLoggerFAllocVars, ZlvPDLoggerFFreeVars,
+     ZlvPDLoggerFCfgChange, [](const ZlvObjClass *c) { return c->logger.fLog == ZlvPDLoggerFLog; }},
     {"zlv_levelfilter", ZLV_KIND_FILTER, nullptr, nullptr, ZlvLevelFilterFCfgChange,
      [](const ZlvObjClass *c) {
          return c->filter.fProcess == ZlvBasicFilterFProcess &&
                 c->filter.fIsLoggable == ZlvLevelFilterFIsLoggable &&
+                c->filter.fLog == ZlvBasicObjectFLog;
+     }},
+    {"zlv_msgidfilter", ZLV_KIND_FILTER, ZlvMsgIdFilterFAllocVars, ZlvMsgIdFilterFFreeVars,
+     ZlvMsgIdFilterFCfgChange,
+     [](const ZlvObjClass *c) {
+         return c->filter.fProcess == ZlvBasicFilterFProcess &&
+                c->filter.fIsLoggable == ZlvMsgIdFilterFIsLoggable &&
                 c->filter.fLog == ZlvBasicObjectFLog;
      }},
     {"zlv_consolehandler", ZLV_KIND_HANDLER, ZlvConsoleHandlerFAllocVars,
@@ -255,6 +268,21 @@ const Builtin builtins[] = {
     {"zlv_basicformatter", ZLV_KIND_FORMATTER, nullptr, nullptr, ZlvBasicFormatterFCfgChange,
      [](const ZlvObjClass *c) {
          return c->formatter.fFormat == ZlvBasicUFormatterFFormat &&
+                c->formatter.fGetHeader == ZlvBasicFormatterFGetHeader &&
+                c->formatter.fGetTrailer == ZlvBasicFormatterFGetTrailer &&
+                c->formatter.fBindMsg == zlvIntlBindUI18Msg;
+     }},
+    {"zlv_xmlformatter", ZLV_KIND_FORMATTER, ZlvPDXMLFormatterFAllocVars,
+     ZlvPDXMLFormatterFFreeVars, ZlvPDXMLFormatterFCfgChange,
+     [](const ZlvObjClass *c) {
+         return c->formatter.fFormat == ZlvPDXMLUFormatterFFormat &&
+                c->formatter.fGetHeader == ZlvPDXMLFormatterFGetHeader &&
+                c->formatter.fGetTrailer == ZlvPDXMLFormatterFGetTrailer &&
+                c->formatter.fBindMsg == zlvIntlBindUI18Msg;
+     }},
+    {"zlv_vyxtraceformatter", ZLV_KIND_FORMATTER, nullptr, nullptr, nullptr,
+     [](const ZlvObjClass *c) {
+         return c->formatter.fFormat == ZlvVyxTraceUFormatterFFormat &&
                 c->formatter.fGetHeader == ZlvBasicFormatterFGetHeader &&
                 c->formatter.fGetTrailer == ZlvBasicFormatterFGetTrailer &&
                 c->formatter.fBindMsg == zlvIntlBindUI18Msg;

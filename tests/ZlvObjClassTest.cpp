@@ -335,13 +335,19 @@ TEST_P(ZlvObjClassQuery, ItsTwinGivesTheSame)
 INSTANTIATE_TEST_SUITE_P(
     , ZlvObjClassQuery,
     testing::Values(
-        Query{"logger", ZlvGetLoggerClasses, zlvIntlGetLoggerClasses, {"zlv_basiclogger"}},
-        Query{"filter", ZlvGetFilterClasses, zlvIntlGetFilterClasses, {"zlv_levelfilter"}},
+        Query{"logger",
+              ZlvGetLoggerClasses,
+              zlvIntlGetLoggerClasses,
+              {"zlv_basiclogger", "zlv_pdlogger"}},
+        Query{"filter",
+              ZlvGetFilterClasses,
+              zlvIntlGetFilterClasses,
+              {"zlv_levelfilter", "zlv_msgidfilter"}},
         Query{"handler", ZlvGetHandlerClasses, zlvIntlGetHandlerClasses, {"zlv_consolehandler"}},
         Query{"formatter",
               ZlvGetFormatterClasses,
               zlvIntlGetFormatterClasses,
-              {"zlv_basicformatter"}}),
+              {"zlv_basicformatter", "zlv_xmlformatter", "zlv_vyxtraceformatter"}}),
     [](const auto &row) { return std::string(row.param.name); });
 
 /// "app" with one listener, a filter of a class of the test's own, which has one recorder.

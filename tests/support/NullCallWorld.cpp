@@ -82,6 +82,8 @@ void release(const volatile void *result, char answer)
         ZlvFreeEvent(static_cast<ZlvEvent *>(mine));
     else if (answer == 'm')
         ZlvFreeI18Msg(static_cast<ZlvI18Msg *>(mine));
+    else if (answer == 's')
+        ZlvFreeStringList(static_cast<StringList *>(mine));
 }
 
 } // namespace zelvo_test

@@ -9,7 +9,8 @@
 #include "zelvo.h"
 
 #if !defined(__clang__)
-// An argument list has attributes that no template parameter carries, and none of them matters here.
+// An argument list has attributes that no template parameter carries, and none of them matters
+// here.
 #pragma GCC diagnostic ignored "-Wattributes"
 #pragma GCC diagnostic ignored "-Wignored-attributes"
 #endif

@@ -23,7 +23,8 @@ namespace zelvo_test {
 ///     i  22, the number of EINVAL        N  no level        n  another number than 0
 ///     e  the status 'p' with code 22     -  the success status
 ///     f  new memory                      o  a new reference to an object
-///     v  a new event                     m  a new message   l  something lent, or a record in use
+///     v  a new event                     m  a new message   s  a new list of strings
+///     l  something lent, or a record in use
 ///     .  no result                       x  must not be null, says its contract: not called
 struct NullCall {
     const char *name;
