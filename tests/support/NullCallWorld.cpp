@@ -9,6 +9,14 @@ namespace {
 const char *classOf(Kind kind)
 {
     switch (kind) {
+    case Kind::PDLogger:
+        return "zlv_pdlogger";
+    case Kind::MsgIdFilter:
+        return "zlv_msgidfilter";
+    case Kind::XMLFormatter:
+        return "zlv_xmlformatter";
+    case Kind::TraceFormatter:
+        return "zlv_vyxtraceformatter";
     case Kind::Filter:
         return "zlv_levelfilter";
     case Kind::Handler:
