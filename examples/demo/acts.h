@@ -12,4 +12,7 @@ void scene(const char *title, const char *explanation);
 /// One tree of objects that logs in several languages and changes while it runs (tree.c).
 void showTree(void);
 
+/// One event in all layouts, and a filter that knows message identifiers (records.c).
+void showRecords(void);
+
 #endif

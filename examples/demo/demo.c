@@ -28,6 +28,9 @@ int main(void)
     act("one tree, seven levels, three languages");
     showTree();
 
+    act("one event, three layouts, and identifiers that filters know");
+    showRecords();
+
     ZlvCloseToolkit(); // frees every object, configuration and class
     return 0;
 }
