@@ -11,6 +11,10 @@ if(ZELVO_SANITIZE)
     target_link_options(zelvo_options INTERFACE -fsanitize=${ZELVO_SANITIZE})
 endif()
 
+if(ZELVO_FUZZ)
+    target_compile_options(zelvo_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
+
 if(ZELVO_COVERAGE)
     target_compile_options(zelvo_options INTERFACE --coverage -fprofile-update=atomic)
     target_link_options(zelvo_options INTERFACE --coverage)

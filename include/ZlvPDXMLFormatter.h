@@ -152,7 +152,8 @@ ZLV_API ZlvBool zlvPDXMLEmitUSource(CxUStringBuff *buff, const ZlvEvent *event);
  *
  * @param buff   the record; null is ignored
  * @param event  the event; null has no message
- * @param args   the message's arguments, copied before they are read; a null list gives none
+ * @param args   the message's arguments, copied before they are read; a null list stands for
+ *               zeros and for texts that show nothing
  * @lock the caller holds the API mutex
  */
 ZLV_API void zlvPDXMLEmitUTranslationInfo(CxUStringBuff *buff, const ZlvEvent *event, va_list args);

@@ -22,29 +22,38 @@ void addArgument(CxUStringBuff *out, ArgKind kind, ArgList &args)
         CxUStringBuffAppendUDouble(out, va_arg(args.list, double));
 }
 
-void addArguments(CxUStringBuff *out, const ArgKinds &kinds, va_list args)
+/// Stands in for an argument when there is no list: zeros, as for binding the message.
+void addZero(CxUStringBuff *out, ArgKind kind)
 {
-    ArgList own{args};
+    if (kind != ArgKind::TEXT)
+        CxUStringBuffAppendUStr(out, u"0");
+}
+
+/// Shows the arguments, up to the first that is absent; ADD appends the value of one.
+template <class Add>
+void addEach(CxUStringBuff *out, const ArgKinds &kinds, Add add)
+{
     for (const ArgKind kind : kinds.of) {
         if (kind == ArgKind::ABSENT)
             return;
         CxUStringBuffAppendUStr(out, u"<Param><![CDATA[");
-        addArgument(out, kind, own);
+        add(kind);
         CxUStringBuffAppendUStr(out, u"]]></Param>");
     }
 }
 
-/// Shows the arguments of the message's pattern, if that can be had. A list is touched only for a
-/// pattern that has arguments to show.
+/// Shows the arguments of the message's pattern, if that can be had.
 void addArguments(CxUStringBuff *out, const ZlvI18Msg *message, va_list args)
 {
     UErrorCode status = U_ZERO_ERROR;
     const BundlePattern pattern{message, &status};
-    if (U_FAILURE(status) || isAbsent(args))
+    if (U_FAILURE(status))
         return;
     const ArgKinds kinds = fetchableKinds(pattern.get());
-    if (kinds.of[0] != ArgKind::ABSENT)
-        addArguments(out, kinds, args);
+    if (isAbsent(args))
+        return addEach(out, kinds, [&](ArgKind kind) { addZero(out, kind); });
+    ArgList own{args};
+    addEach(out, kinds, [&](ArgKind kind) { addArgument(out, kind, own); });
 }
 
 } // namespace

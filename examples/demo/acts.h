@@ -20,4 +20,7 @@ void shareFile(void);
 /// What one of those processes does; each is this program, started with these two arguments.
 void runTill(int32_t till, const char *semaphoreKey);
 
+/// One event in all layouts, and a filter that knows message identifiers (records.c).
+void showRecords(void);
+
 #endif

@@ -36,6 +36,8 @@ int main(int argc, char **argv)
     showTree();
     act("one file, four processes");
     shareFile();
+    act("one event, three layouts, and identifiers that filters know");
+    showRecords();
 
     ZlvCloseToolkit(); // frees every object, configuration and class
     return 0;

@@ -19,6 +19,7 @@ struct Record {
     bool isMessage;
     UText text; ///< the message, bound in its own locale
     std::map<std::string, std::string> properties;
+    Text messageId;
 };
 
 /// The class Recorder::className, whose handlers add to one list of records. They keep no open or
@@ -56,7 +57,8 @@ private:
     {
         records_.push_back({handler->name, ZlvGetEventLevel(event),
                             ZlvGetEventIsMessage(event) == 1,
-                            taken(zlvIntlBindUI18Msg(event->message, args)), propertiesOf(event)});
+                            taken(zlvIntlBindUI18Msg(event->message, args)), propertiesOf(event),
+                            taken(ZlvGetEventMessageId(event))});
         if (leaves_.type != CX_STATUS_OK)
             event->status = leaves_;
     }
@@ -67,7 +69,7 @@ private:
         if (event->properties == nullptr)
             return all;
         for (auto *node = event->properties->first; node; node = node->next)
-            all[node->key] = node->value ? node->value : "(null)";
+            all[node->key ? node->key : "(null)"] = node->value ? node->value : "(null)";
         return all;
     }
 
