@@ -165,8 +165,9 @@ TEST_F(ZlvDestructiveOrders, AnAllocateEntryCreatesTheObjectAsOneOfAnotherClass)
         return zlvIntlGetObject("app", "zlv_basiclogger");
     };
     EXPECT_EQ(get("app", Scripted::logger), nullptr) << "the name is taken by then";
-    EXPECT_STREQ(keep(object("app"))->objClass->name, "zlv_basiclogger");
-    ZlvReleaseObject(object("app"));
+    ZlvObject *app = object("app");
+    EXPECT_STREQ(app->objClass->name, "zlv_basiclogger");
+    ZlvReleaseObject(app);
 }
 
 TEST_F(ZlvDestructiveOrders, AConfigurationChangeReleasesTheObjectBeingConfigured)

@@ -7,7 +7,8 @@
 #include <malloc.h>
 
 #if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-#include <sanitizer/allocator_interface.h>
+// The sanitizers' own header does not come with every compiler.
+extern "C" size_t __sanitizer_get_current_allocated_bytes();
 #endif
 
 namespace zelvo_test {

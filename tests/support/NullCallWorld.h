@@ -130,7 +130,8 @@ private:
     uint32_t count_ = 0;
     uint64_t thread_ = 0;
     CxMutex mutex_ = nullptr;
-    CxDirectory directory_ = nullptr;
+    CxDirectory directory_ = nullptr; ///< a call may empty it
+    CxDirectory opened_ = nullptr;
     CxStatus status_{CX_STATUS_OK, 0};
     CxFilePath path_{};
     CxFileInfo info_{};
