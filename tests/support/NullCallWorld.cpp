@@ -38,7 +38,8 @@ NullCallWorld::NullCallWorld(Kind kind)
     event_ = ZlvVaAllocUEvent(ZLV_LEVEL_INFO, nullptr, nullptr, u"text", noArgs());
     parm_.type = ZLV_PARM_INT;
     CxMutexCreate(&mutex_);
-    CxDirectoryOpen(&directory_, ".");
+    CxDirectoryOpen(&opened_, ".");
+    directory_ = opened_;
     CxInitFilePath(&path_, "sample");
     CxStringBuffAppendStr(&buff_, "sample");
     CxUStringBuffAppendStr(&wideBuff_, "sample");
@@ -71,7 +72,7 @@ NullCallWorld::~NullCallWorld()
     CxStringBuffDiscard(&buff_);
     CxUStringBuffDiscard(&wideBuff_);
     CxPropListDiscard(&props_);
-    CxDirectoryClose(&directory_);
+    CxDirectoryClose(&opened_);
     CxMutexDestroy(&mutex_);
     ZlvFreeEvent(event_);
     ZlvReleaseObjCfg(cfg_);

@@ -128,7 +128,8 @@ private:
     uint32_t count_ = 0;
     uint64_t thread_ = 0;
     CxMutex mutex_ = nullptr;
-    CxDirectory directory_ = nullptr;
+    CxDirectory opened_ = nullptr;
+    CxDirectory directory_ = nullptr; ///< the same, until a call that fails forgets it
     CxStatus status_{CX_STATUS_OK, 0};
     CxFilePath path_{};
     CxFileInfo info_{};
