@@ -212,8 +212,8 @@ INSTANTIATE_TEST_SUITE_P(, ZlvPDXMLSource, testing::ValuesIn(sources),
 
 TEST_F(ZlvPDXMLPiece, WritesNoPieceIntoNoBuffer)
 {
-    set("zlv_prop_srcfile", "a.c");
     key("plain");
+    set("zlv_prop_srcfile", "a.c");
     HeldMutex held;
     zlvPDXMLEmitULevel(nullptr, ZLV_LEVEL_INFO);
     zlvPDXMLEmitUProductInfo(nullptr, event_, 1, 1, 1, 1);

@@ -142,7 +142,7 @@ TEST_F(ZlvPDXMLRecord, OfATraceHasNoTranslation)
     ZlvSetEventIsMessage(event_, 0);
     EXPECT_EQ(record(), u"<Trace>"
                         u"\n" RECORD_TIME u" <LogText><![CDATA[Service "
-                        u"stopped]]></LogText>\n" NO_SOURCE u"</Trace>\n");
+                        u"halted]]></LogText>\n" NO_SOURCE u"</Trace>\n");
 }
 
 TEST_F(ZlvPDXMLRecord, OfAMessageHasNeitherThreadNorProcess)
