@@ -7,7 +7,9 @@
 #include <malloc.h>
 
 #if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-#include <sanitizer/allocator_interface.h>
+// g++ 12 comes without the header that declares this.
+// NOLINTNEXTLINE(bugprone-reserved-identifier, cert-dcl37-c, cert-dcl51-cpp): the runtime's name
+extern "C" size_t __sanitizer_get_current_allocated_bytes();
 #endif
 
 namespace zelvo_test {
