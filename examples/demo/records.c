@@ -25,10 +25,9 @@ void showRecords(void)
           "XML record with everything, a trace line with fixed fields.");
     ZlvLogError(log, BUNDLE, "till_jammed", u"drawer", 1);
 
-    scene(
-        "Identifiers decide",
-        "The filter blocks the identifiers TIL...I, and passes each of the others at most once\n"
-        "in a minute: six calls, two records.");
+    scene("Identifiers decide",
+          "The filter blocks the identifiers TIL...I, and passes each of the others at most once\n"
+          "in a minute: six calls, two records.");
     ZlvSetObjProp(log, "listenerNames", "filter.ids");
     sell(log);
     ZlvReleaseObject(log);
