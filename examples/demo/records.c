@@ -19,7 +19,7 @@ static void sell(ZlvObject *log)
 
 void showRecords(void)
 {
-    ZlvObject *log = ZlvGetObject("till.log", NULL);
+    ZlvObject *log = ZlvGetObject("desk.log", NULL);
     scene("One event, three layouts",
           "The logger stamps product, component and server on the event. A line for people, an\n"
           "XML record with everything, a trace line with fixed fields.");
