@@ -3,9 +3,11 @@
 
 #include "ZlvBasicFormatter.h"
 #include "ZlvConsoleHandler.h"
+#include "ZlvFileHandler.h"
 #include "ZlvIntl.h"
 #include "ZlvLevelFilter.h"
 #include "ZlvMsgIdFilter.h"
+#include "ZlvMultiProcFileHandler.h"
 #include "ZlvPDLogger.h"
 #include "ZlvPDXMLFormatter.h"
 #include "ZlvVyxTraceFormatter.h"
@@ -64,6 +66,26 @@ constexpr BuiltinClass builtins[] = {
       .fAllocVars = ZlvConsoleHandlerFAllocVars,
       .fFreeVars = ZlvConsoleHandlerFFreeVars,
       .fCfgChange = ZlvBasicHandlerFCfgChange}},
+    {"zlv_filehandler",
+     {.kind = ZLV_KIND_HANDLER,
+      .name = nullptr,
+      .description = nullptr,
+      .handler = {.fProcess = ZlvFileUHandlerFProcess,
+                  .fOpen = ZlvFileHandlerFOpen,
+                  .fClose = ZlvFileHandlerFClose},
+      .fAllocVars = ZlvFileHandlerFAllocVars,
+      .fFreeVars = ZlvFileHandlerFFreeVars,
+      .fCfgChange = ZlvFileHandlerFCfgChange}},
+    {"zlv_multiproc_filehandler",
+     {.kind = ZLV_KIND_HANDLER,
+      .name = nullptr,
+      .description = nullptr,
+      .handler = {.fProcess = ZlvMultiProcFileUHandlerFProcess,
+                  .fOpen = ZlvMultiProcFileHandlerFOpen,
+                  .fClose = ZlvMultiProcFileHandlerFClose},
+      .fAllocVars = ZlvFileHandlerFAllocVars,
+      .fFreeVars = ZlvFileHandlerFFreeVars,
+      .fCfgChange = ZlvFileHandlerFCfgChange}},
     {"zlv_basicformatter",
      {.kind = ZLV_KIND_FORMATTER,
       .name = nullptr,

@@ -15,7 +15,7 @@ namespace {
 std::vector<NullCall> allCalls()
 {
     std::vector<NullCall> all = portabilityNullCalls();
-    for (const auto &more : {containerNullCalls(), toolkitNullCalls()})
+    for (const auto &more : {containerNullCalls(), toolkitNullCalls(), classNullCalls()})
         all.insert(all.end(), more.begin(), more.end());
     return all;
 }

@@ -1,14 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// Objects: create-or-get, references, name, description, the enabled flag.
+// Objects: create-or-get.
 #include "support/FailAlloc.h"
 #include "support/Scripted.h"
 #include "support/ToolkitFixture.h"
-#include "support/VaList.h"
 
-#include "ZlvEvent.h"
-#include "ZlvHandler.h"
 #include "ZlvIntl.h"
-#include "ZlvOwned.h"
 
 namespace zelvo_test {
 namespace {
@@ -287,153 +283,6 @@ TEST_F(ZlvObjectTest, ObjectsMadeBeforeOpenAreTheSameAfterwards)
     EXPECT_EQ(object("early"), early);
 }
 
-TEST_F(ZlvObjectTest, AcquiringAddsAReference)
-{
-    ZlvObject *app = logger("app");
-    EXPECT_EQ(ZlvAcquireObject(app), app);
-    EXPECT_EQ(app->refCount, 3u);
-    ZlvReleaseObject(app);
-}
-
-TEST_F(ZlvObjectTest, ReleasingTakesAReferenceAway)
-{
-    ZlvObject *app = logger("app");
-    logger("app");
-    ZlvAcquireObject(app);
-    ZlvReleaseObject(app);
-    EXPECT_EQ(app->refCount, 3u);
-}
-
-TEST_F(ZlvObjectTest, TheLastReleaseDestroysTheObject)
-{
-    ZlvReleaseObject(ZlvGetObject("app", "zlv_basiclogger"));
-    EXPECT_EQ(zlvToolkitGetObjInstance("app"), nullptr);
-}
-
-TEST_F(ZlvObjectTest, AFreshObjectOfAReleasedNameIsConfiguredAgain)
-{
-    close();
-    open("app.key=value\n");
-    ZlvObject *first = ZlvGetObject("app", "zlv_basiclogger");
-    setProp(first, "key", "other");
-    ZlvReleaseObject(first);
-    EXPECT_EQ(prop(logger("app"), "key"), "value");
-}
-
-TEST_F(ZlvObjectTest, AReleasedNameCanBeTakenByAnotherClass)
-{
-    ZlvReleaseObject(ZlvGetObject("app", "zlv_basiclogger"));
-    EXPECT_NE(filter("app"), nullptr);
-}
-
-TEST_F(ZlvObjectTest, AnObjectReleasedTooOftenIsNotDestroyedAgain)
-{
-    ZlvObject *app = ZlvGetObject("app", "zlv_basiclogger");
-    zelvo::ApiLock lock;
-    zlvIntlReleaseObject(app);
-    zlvIntlReleaseObject(app);
-    zlvIntlReleaseObject(app);
-    EXPECT_EQ(app->objClass, nullptr) << "readable until the mutex is released";
-}
-
-TEST_F(ZlvObjectTest, AnObjectWithoutAClassIsNotReleased)
-{
-    ZlvObject loose{};
-    loose.refCount = 2;
-    ZlvReleaseObject(&loose);
-    EXPECT_EQ(loose.refCount, 2u);
-}
-
-TEST_F(ZlvObjectTest, ACountThatFallsToZeroDestroysNothing)
-{
-    ZlvObject *app = logger("app");
-    app->refCount = 1;
-    zlvIntlReleaseObject(app);
-    EXPECT_EQ(app->refCount, 0u);
-    EXPECT_NE(app->objClass, nullptr);
-    app->refCount = 2;
-}
-
-TEST_F(ZlvObjectTest, NullIsNeitherAcquiredNorReleased)
-{
-    EXPECT_EQ(ZlvAcquireObject(nullptr), nullptr);
-    ZlvReleaseObject(nullptr);
-}
-
-TEST_F(ZlvObjectTest, TheNameIsHandedOutAsACopy)
-{
-    ZlvObject *app = logger("app");
-    char *name = ZlvGetObjectName(app);
-    EXPECT_NE(name, app->name);
-    EXPECT_EQ(taken(name), "app");
-}
-
-TEST_F(ZlvObjectTest, NullHasNoName)
-{
-    EXPECT_EQ(ZlvGetObjectName(nullptr), nullptr);
-}
-
-TEST_F(ZlvObjectTest, TheDescriptionIsThatOfItsClassBoundToText)
-{
-    ZlvI18Msg *description = ZlvAllocUI18Msg(nullptr, nullptr, u"It''s a logger");
-    ZlvAddLoggerClass("mine", description, nullptr, nullptr, nullptr, nullptr);
-    ZlvFreeI18Msg(description);
-    EXPECT_EQ(taken(ZlvGetObjectDesc(logger("app", "mine"))), u"It's a logger");
-}
-
-TEST_F(ZlvObjectTest, ADescriptionWithPlaceholdersIsBoundWithZeros)
-{
-    ZlvI18Msg *description = ZlvAllocUI18Msg(nullptr, nullptr, u"No. {0,number,integer}");
-    ZlvAddLoggerClass("mine", description, nullptr, nullptr, nullptr, nullptr);
-    ZlvFreeI18Msg(description);
-    EXPECT_EQ(taken(ZlvGetObjectDesc(logger("app", "mine"))), u"No. 0");
-}
-
-TEST_F(ZlvObjectTest, AClassWithoutADescriptionGivesNone)
-{
-    EXPECT_EQ(ZlvGetObjectDesc(logger("app")), nullptr);
-}
-
-TEST_F(ZlvObjectTest, NullHasNoDescription)
-{
-    EXPECT_EQ(ZlvGetObjectDesc(nullptr), nullptr);
-}
-
-TEST_F(ZlvObjectTest, HandlesAreEqualWhenTheyAreTheSame)
-{
-    ZlvObject *app = logger("app");
-    EXPECT_EQ(ZlvAreObjectsEqual(app, object("app")), 1);
-    EXPECT_EQ(ZlvAreObjectsEqual(app, logger("other")), 0);
-    EXPECT_EQ(ZlvAreObjectsEqual(app, nullptr), 0);
-    EXPECT_EQ(ZlvAreObjectsEqual(nullptr, app), 0);
-    EXPECT_EQ(ZlvAreObjectsEqual(nullptr, nullptr), 1);
-}
-
-TEST_F(ZlvObjectTest, IsDisabledAndEnabledAgain)
-{
-    ZlvObject *app = logger("app");
-    EXPECT_EQ(ZlvIsObjectEnabled(app), 1);
-    ZlvSetObjectEnabled(app, 0);
-    EXPECT_EQ(ZlvIsObjectEnabled(app), 0);
-    ZlvSetObjectEnabled(app, 1);
-    EXPECT_EQ(ZlvIsObjectEnabled(app), 1);
-}
-
-TEST_F(ZlvObjectTest, AnyTruthEnables)
-{
-    ZlvObject *app = logger("app");
-    ZlvSetObjectEnabled(app, 0);
-    ZlvSetObjectEnabled(app, 2);
-    EXPECT_EQ(ZlvIsObjectEnabled(app), 1);
-}
-
-TEST_F(ZlvObjectTest, NullIsNotEnabled)
-{
-    EXPECT_EQ(ZlvIsObjectEnabled(nullptr), 0);
-    ZlvSetObjectEnabled(nullptr, 1);
-    EXPECT_EQ(ZlvIsObjectEnabled(nullptr), 0);
-}
-
 TEST_F(ZlvObjectTest, WantOfMemoryMakesNoObjectAndLosesNothing)
 {
     ZlvObject *app = nullptr;
@@ -443,68 +292,6 @@ TEST_F(ZlvObjectTest, WantOfMemoryMakesNoObjectAndLosesNothing)
         app = ZlvGetObject("app", "zlv_consolehandler");
     }
     EXPECT_EQ(keep(app)->refCount, 2u);
-}
-
-/// Asking a filter's accept entry from outside.
-class ZlvIsLoggableByFilterTest : public ToolkitFixture {
-protected:
-    void SetUp() override
-    {
-        open();
-        event_ = ZlvVaAllocUEvent(ZLV_LEVEL_INFO, nullptr, nullptr, u"text", noArgs());
-    }
-    void TearDown() override
-    {
-        ZlvFreeEvent(event_);
-        ToolkitFixture::TearDown();
-    }
-
-    ZlvBool asked(ZlvObject *filter) { return ZlvIsLoggableByFilter(filter, event_, noArgs()); }
-
-    ZlvEvent *event_ = nullptr;
-};
-
-TEST_F(ZlvIsLoggableByFilterTest, GivesTheEntrysAnswer)
-{
-    ZlvObject *warn = filter("warn");
-    EXPECT_EQ(asked(warn), 1);
-    setProp(warn, "level", "WARN");
-    EXPECT_EQ(asked(warn), 0);
-}
-
-TEST_F(ZlvIsLoggableByFilterTest, HandsTheEntrysResultOn)
-{
-    ZlvAddFilterClass(
-        "two", nullptr, nullptr, nullptr, nullptr, nullptr,
-        [](ZlvObject *, ZlvEvent *, va_list) { return 2; }, nullptr);
-    EXPECT_EQ(asked(filter("filter", "two")), 2);
-}
-
-TEST_F(ZlvIsLoggableByFilterTest, DoesNotAskWhetherTheFilterIsEnabled)
-{
-    ZlvObject *off = filter("off");
-    ZlvSetObjectEnabled(off, 0);
-    EXPECT_EQ(asked(off), 1);
-}
-
-TEST_F(ZlvIsLoggableByFilterTest, OtherKindsAcceptNothing)
-{
-    EXPECT_EQ(asked(logger("app")), 0);
-    EXPECT_EQ(asked(handler("handler")), 0);
-    EXPECT_EQ(asked(formatter("formatter")), 0);
-}
-
-TEST_F(ZlvIsLoggableByFilterTest, AClassWithoutTheEntryAcceptsNothing)
-{
-    ZlvAddFilterClass("none", nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr);
-    zlvToolkitGetClassDef("none")->filter.fIsLoggable = nullptr;
-    EXPECT_EQ(asked(filter("filter", "none")), 0);
-}
-
-TEST_F(ZlvIsLoggableByFilterTest, NullAcceptsNothing)
-{
-    EXPECT_EQ(asked(nullptr), 0);
-    EXPECT_EQ(ZlvIsLoggableByFilter(filter("filter"), nullptr, noArgs()), 0);
 }
 
 } // namespace

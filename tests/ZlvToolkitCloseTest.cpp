@@ -18,6 +18,11 @@ struct State {
 
 class ZlvToolkitState : public ToolkitFixture, public testing::WithParamInterface<State> {};
 
+TEST_P(ZlvToolkitState, IsEmptyAtFirst)
+{
+    EXPECT_TRUE(GetParam().isEmpty());
+}
+
 TEST_P(ZlvToolkitState, IsEmptyAfterClose)
 {
     open();

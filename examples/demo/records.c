@@ -19,16 +19,15 @@ static void sell(ZlvObject *log)
 
 void showRecords(void)
 {
-    ZlvObject *log = ZlvGetObject("till.log", NULL);
+    ZlvObject *log = ZlvGetObject("desk.log", NULL);
     scene("One event, three layouts",
           "The logger stamps product, component and server on the event. A line for people, an\n"
           "XML record with everything, a trace line with fixed fields.");
     ZlvLogError(log, BUNDLE, "till_jammed", u"drawer", 1);
 
-    scene(
-        "Identifiers decide",
-        "The filter blocks the identifiers TIL...I, and passes each of the others at most once\n"
-        "in a minute: six calls, two records.");
+    scene("Identifiers decide",
+          "The filter blocks the identifiers TIL...I, and passes each of the others at most once\n"
+          "in a minute: six calls, two records.");
     ZlvSetObjProp(log, "listenerNames", "filter.ids");
     sell(log);
     ZlvReleaseObject(log);

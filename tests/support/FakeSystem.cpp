@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "support/FakeSystem.h"
 
+#include <cstdarg>
+
 namespace zelvo_test {
 namespace {
 FakeSystem *current = nullptr;
@@ -52,6 +54,7 @@ ANSWER(int, pthread_create,
 ANSWER(int, pthread_join, (pthread_t thread, void **result), (thread, result))
 ANSWER(int, sched_yield, (), ())
 ANSWER(unsigned, sleep, (unsigned seconds), (seconds))
+ANSWER(int, nanosleep, (const struct timespec *time, struct timespec *rest), (time, rest))
 ANSWER(int, gettimeofday, (struct timeval * now, void *zone), (now, zone))
 ANSWER(int, gethostname, (char *name, size_t size), (name, size))
 ANSWER(struct hostent *, gethostbyname, (const char *name), (name))
@@ -59,3 +62,20 @@ ANSWER(pid_t, fork, (), ())
 ANSWER(int, mkdir, (const char *path, mode_t mode), (path, mode))
 ANSWER(int, chmod, (const char *path, mode_t mode), (path, mode))
 ANSWER(int, fsync, (int file), (file))
+ANSWER(int, ftruncate, (int file, off_t length), (file, length))
+ANSWER(int, semget, (key_t key, int count, int flags), (key, count, flags))
+ANSWER(int, semop, (int set, struct sembuf *operations, size_t count), (set, operations, count))
+
+// A function with a variable argument; an answer does without it.
+extern "C" int __real_semctl(int set, int number, int command, ...);
+extern "C" int __wrap_semctl(int set, int number, int command, ...);
+int __wrap_semctl(int set, int number, int command, ...)
+{
+    if (current != nullptr && current->semctl)
+        return current->semctl(set, number, command);
+    va_list list;
+    va_start(list, command);
+    void *argument = command == SETVAL || command == IPC_STAT ? va_arg(list, void *) : nullptr;
+    va_end(list);
+    return __real_semctl(set, number, command, argument);
+}

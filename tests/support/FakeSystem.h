@@ -5,6 +5,7 @@
 
 #include <netdb.h>
 #include <pthread.h>
+#include <sys/sem.h>
 #include <sys/stat.h>
 #include <sys/time.h>
 #include <unistd.h>
@@ -39,6 +40,7 @@ struct FakeSystem {
     std::function<int(pthread_t, void **)> pthread_join;
     std::function<int()> sched_yield;
     std::function<unsigned(unsigned)> sleep;
+    std::function<int(const struct timespec *, struct timespec *)> nanosleep;
     std::function<int(struct timeval *, void *)> gettimeofday;
     std::function<int(char *, size_t)> gethostname;
     std::function<struct hostent *(const char *)> gethostbyname;
@@ -46,6 +48,10 @@ struct FakeSystem {
     std::function<int(const char *, mode_t)> mkdir;
     std::function<int(const char *, mode_t)> chmod;
     std::function<int(int)> fsync;
+    std::function<int(int, off_t)> ftruncate;
+    std::function<int(key_t, int, int)> semget;
+    std::function<int(int, struct sembuf *, size_t)> semop;
+    std::function<int(int, int, int)> semctl;
 };
 
 } // namespace zelvo_test

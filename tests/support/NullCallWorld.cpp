@@ -8,24 +8,11 @@ namespace {
 
 const char *classOf(Kind kind)
 {
-    switch (kind) {
-    case Kind::PDLogger:
-        return "zlv_pdlogger";
-    case Kind::MsgIdFilter:
-        return "zlv_msgidfilter";
-    case Kind::XMLFormatter:
-        return "zlv_xmlformatter";
-    case Kind::TraceFormatter:
-        return "zlv_vyxtraceformatter";
-    case Kind::Filter:
-        return "zlv_levelfilter";
-    case Kind::Handler:
-        return "zlv_consolehandler";
-    case Kind::Formatter:
-        return "zlv_basicformatter";
-    default:
-        return "zlv_basiclogger";
-    }
+    static constexpr const char *CLASSES[] = {
+        "zlv_basiclogger",  "zlv_levelfilter",           "zlv_consolehandler", "zlv_basicformatter",
+        "zlv_filehandler",  "zlv_multiproc_filehandler", "zlv_msgidfilter",    "zlv_pdlogger",
+        "zlv_xmlformatter", "zlv_vyxtraceformatter"};
+    return CLASSES[static_cast<size_t>(kind)];
 }
 
 } // namespace

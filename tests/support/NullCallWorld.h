@@ -22,15 +22,17 @@ using VaListParameter = decltype([](va_list args) {
     return args;
 }(*static_cast<va_list *>(nullptr)));
 
-/// The kind of the object that a call gets; those of its own class where that has variables.
+/// The class of the object that a call gets.
 enum class Kind {
     Logger,
-    PDLogger,
     Filter,
-    MsgIdFilter,
     Handler,
     Formatter,
-    XMLFormatter,
+    FileHandler,
+    SharedFileHandler,
+    MsgIdFilter,
+    PDLogger,
+    XmlFormatter,
     TraceFormatter
 };
 

@@ -22,9 +22,8 @@ namespace zelvo_test {
 ///     0  nothing: null, 0, false        1  1, true         <  -1
 ///     i  22, the number of EINVAL        N  no level        n  another number than 0
 ///     e  the status 'p' with code 22     -  the success status
-///     f  new memory                      o  a new reference to an object
-///     v  a new event                     m  a new message   s  a new list of strings
-///     l  something lent, or a record in use
+///     f  new memory                      o  a new reference to an object   s  a new list
+///     v  a new event                     m  a new message   l  something lent, or a record in use
 ///     .  no result                       x  must not be null, says its contract: not called
 struct NullCall {
     const char *name;
@@ -139,5 +138,7 @@ NullCall makeNullCall(const char *name, const char *answers, Kind kind,
 std::vector<NullCall> portabilityNullCalls();
 std::vector<NullCall> containerNullCalls();
 std::vector<NullCall> toolkitNullCalls();
+/// Those of the file handlers and of problem determination.
+std::vector<NullCall> classNullCalls();
 
 } // namespace zelvo_test

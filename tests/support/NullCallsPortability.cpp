@@ -44,7 +44,6 @@ std::vector<NullCall> portabilityNullCalls()
         CALL(CxMutexDestroy, "e"),
         CALL(CxMutexLock, "e"),
         CALL(CxMutexUnlock, "e"),
-        CALL(CxParseKvtID, "0"),
         CALL(CxProcessCreate, "ee-"),
         CALL(CxProcessGetCurrentID, ""),
         CALL(CxProcessGetCwd, "e"),
