@@ -24,7 +24,8 @@ namespace zelvo_test {
 ///     e  the status 'p' with code 22     -  the success status
 ///     f  new memory                      o  a new reference to an object   s  a new list
 ///     v  a new event                     m  a new message   l  something lent, or a record in use
-///     .  no result                       x  must not be null, says its contract: not called
+///     .  no result                       x  not called: must not be null, says its contract,
+///                                     or a test of its own does it
 struct NullCall {
     const char *name;
     const char *answers;

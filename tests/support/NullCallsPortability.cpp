@@ -44,7 +44,7 @@ std::vector<NullCall> portabilityNullCalls()
         CALL(CxMutexDestroy, "e"),
         CALL(CxMutexLock, "e"),
         CALL(CxMutexUnlock, "e"),
-        CALL(CxProcessCreate, "ee-"),
+        CALL(CxProcessCreate, "eex"),
         CALL(CxProcessGetCurrentID, ""),
         CALL(CxProcessGetCwd, "e"),
         CALL(CxProcessGetEnv, "0"),
