@@ -73,9 +73,9 @@
  *     one list serves several handlers, and the caller may use it again. Where a va_list is a
  *     pointer, a null one stands for zeros.
  *
- * 15. Forks. The library installs no fork handlers. Fork while no other thread is inside the
- *     library, or exec at once: the child would find the mutex held by a thread that it does not
- *     have.
+ * 15. Forks. A fork waits until no other thread is inside the library, so the child may log at
+ *     once. Open log files are shared by both processes from then on, and only the class
+ *     zlv_multiproc_filehandler keeps their records and rollovers in order.
  *
  * 16. Signals. A signal handler must not log, nor call anything else here: the mutex may be held by
  *     the code that it interrupts.
