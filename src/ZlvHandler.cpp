@@ -5,7 +5,7 @@
 #include <type_traits>
 
 #include "CxString.h"
-#include "ZlvOwned.h"
+#include "ZlvApiMutex.h"
 #include "util/CxOwned.h"
 
 using namespace zelvo;
@@ -42,8 +42,7 @@ ZlvObject *zlvIntlHandlerGetFormatter(ZlvObject *handler)
 
 ZlvObject *ZlvHandlerGetFormatter(ZlvObject *handler)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlHandlerGetFormatter(handler) : nullptr;
+    return locked(zlvIntlHandlerGetFormatter, handler);
 }
 
 void zlvIntlHandlerSetFormatter(ZlvObject *handler, ZlvObject *formatter)
@@ -59,9 +58,7 @@ void zlvIntlHandlerSetFormatter(ZlvObject *handler, ZlvObject *formatter)
 
 void ZlvHandlerSetFormatter(ZlvObject *handler, ZlvObject *formatter)
 {
-    const ApiLock lock;
-    if (lock)
-        zlvIntlHandlerSetFormatter(handler, formatter);
+    locked(zlvIntlHandlerSetFormatter, handler, formatter);
 }
 
 char *zlvIntlHandlerGetFmtHeader(ZlvObject *handler)
@@ -71,8 +68,7 @@ char *zlvIntlHandlerGetFmtHeader(ZlvObject *handler)
 
 char *ZlvHandlerGetFmtHeader(ZlvObject *handler)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlHandlerGetFmtHeader(handler) : nullptr;
+    return locked(zlvIntlHandlerGetFmtHeader, handler);
 }
 
 char *zlvIntlHandlerGetFmtTrailer(ZlvObject *handler)
@@ -82,8 +78,7 @@ char *zlvIntlHandlerGetFmtTrailer(ZlvObject *handler)
 
 char *ZlvHandlerGetFmtTrailer(ZlvObject *handler)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlHandlerGetFmtTrailer(handler) : nullptr;
+    return locked(zlvIntlHandlerGetFmtTrailer, handler);
 }
 
 UChar *zlvIntlUHandlerDoFmt(ZlvObject *handler, ZlvEvent *event, va_list args)
@@ -93,8 +88,7 @@ UChar *zlvIntlUHandlerDoFmt(ZlvObject *handler, ZlvEvent *event, va_list args)
 
 UChar *ZlvUHandlerDoFmt(ZlvObject *handler, ZlvEvent *event, va_list args)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlUHandlerDoFmt(handler, event, args) : nullptr;
+    return locked(zlvIntlUHandlerDoFmt, handler, event, args);
 }
 
 void ZlvBasicHandlerFCfgChange(ZlvObject *handler, const char *propertyName)

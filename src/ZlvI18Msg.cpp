@@ -10,8 +10,8 @@
 #include "CxMemory.h"
 #include "CxString.h"
 #include "CxUString.h"
+#include "ZlvApiMutex.h"
 #include "ZlvLocaleName.h"
-#include "ZlvOwned.h"
 
 using namespace zelvo;
 
@@ -43,8 +43,7 @@ ZlvI18Msg *zlvIntlAllocUI18Msg(const char *bundle, const char *key, const UChar 
 
 ZlvI18Msg *ZlvAllocUI18Msg(const char *bundle, const char *key, const UChar *text)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlAllocUI18Msg(bundle, key, text) : nullptr;
+    return locked(zlvIntlAllocUI18Msg, bundle, key, text);
 }
 
 ZlvI18Msg *zlvIntlCopyI18Msg(const ZlvI18Msg *message)
@@ -65,8 +64,7 @@ ZlvI18Msg *zlvIntlCopyI18Msg(const ZlvI18Msg *message)
 
 ZlvI18Msg *ZlvCopyI18Msg(const ZlvI18Msg *message)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlCopyI18Msg(message) : nullptr;
+    return locked(zlvIntlCopyI18Msg, message);
 }
 
 void zlvIntlFreeI18Msg(ZlvI18Msg *message)
@@ -82,9 +80,7 @@ void zlvIntlFreeI18Msg(ZlvI18Msg *message)
 
 void ZlvFreeI18Msg(ZlvI18Msg *message)
 {
-    const ApiLock lock;
-    if (lock)
-        zlvIntlFreeI18Msg(message);
+    locked(zlvIntlFreeI18Msg, message);
 }
 
 ParmList *zlvGetI18MsgParmList(ZlvI18Msg *message)

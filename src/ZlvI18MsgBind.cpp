@@ -11,9 +11,9 @@
 #include <unicode/umsg.h>
 #include <unicode/ustring.h>
 
+#include "ZlvApiMutex.h"
 #include "ZlvBundlePattern.h"
 #include "ZlvIcuText.h"
-#include "ZlvOwned.h"
 
 namespace zelvo {
 namespace {
@@ -126,6 +126,5 @@ UChar *zlvIntlBindUI18Msg(ZlvI18Msg *message, va_list args)
 
 UChar *ZlvBindUI18Msg(ZlvI18Msg *message, va_list args)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlBindUI18Msg(message, args) : nullptr;
+    return locked(zlvIntlBindUI18Msg, message, args);
 }

@@ -3,8 +3,8 @@
 // tree, and the configuration of the basic logger class. The public calls are in ZlvLogCalls.cpp.
 #include "ZlvLogger.h"
 
+#include "ZlvApiMutex.h"
 #include "ZlvLoggerIntl.h"
-#include "ZlvOwned.h"
 
 using namespace zelvo;
 
@@ -55,8 +55,7 @@ ZlvFLog zlvIntlLoggerGetFLog(ZlvObject *logger)
 
 ZlvFLog ZlvLoggerGetFLog(ZlvObject *logger)
 {
-    const ApiLock lock;
-    return lock ? zlvIntlLoggerGetFLog(logger) : nullptr;
+    return locked(zlvIntlLoggerGetFLog, logger);
 }
 
 ZlvStatus zlvLogUMessageEntry(ZlvObject *logger, ZlvLevel level, const char *bundle,

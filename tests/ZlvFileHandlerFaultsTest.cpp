@@ -33,6 +33,7 @@ protected:
 TEST_P(ZlvFileHandlerFaults, AFullDisk)
 {
     const SmallDisk disk;
+    // Mounting takes root; without it the limit on file sizes stands in, further below.
     if (!disk.isThere())
         GTEST_SKIP() << "no right to mount a file system";
     SmallDisk::fill();
@@ -48,6 +49,7 @@ TEST_P(ZlvFileHandlerFaults, AFullDisk)
 TEST_P(ZlvFileHandlerFaults, ADiskThatFillsWhileLogging)
 {
     const SmallDisk disk;
+    // Mounting takes root; without it the limit on file sizes stands in, further below.
     if (!disk.isThere())
         GTEST_SKIP() << "no right to mount a file system";
     logger("fileName", "disk/app.log");
@@ -119,6 +121,7 @@ TEST_P(ZlvFileHandlerFaults, AFileInThePlaceOfTheDirectory)
 
 TEST_P(ZlvFileHandlerFaults, ADirectoryOfSomebodyElse)
 {
+    // A file that is one's own can always be opened again: this takes a second user.
     if (geteuid() != 0)
         GTEST_SKIP() << "only root can become somebody else";
     std::filesystem::permissions(".", std::filesystem::perms{0777});

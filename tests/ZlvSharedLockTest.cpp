@@ -257,6 +257,7 @@ TEST_F(ZlvSharedLock, OfAProcessThatEndsWithoutGivingItBackIsFree)
 
 TEST_F(ZlvSharedLock, OfSomebodyElseIsRefused)
 {
+    // A set that is one's own is never refused: this takes a second user.
     if (geteuid() != 0)
         GTEST_SKIP() << "only root can become somebody else";
     semget(key_, 1, IPC_CREAT | 0600);

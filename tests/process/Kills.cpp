@@ -32,7 +32,7 @@ protected:
         {
             const uint32_t goal = progress->acknowledged + records;
             EXPECT_TRUE(eventually([&] { return progress->acknowledged >= goal; }));
-            usleep(microseconds);
+            usleep(microseconds); // waits for nothing: it moves the kill to a random step
             process->kill();
             if (progress->begun != progress->acknowledged)
                 unanswered.insert(progress->begun);

@@ -36,7 +36,7 @@ bool eventually(const std::function<bool()> &condition)
     while (!condition()) {
         if (std::chrono::steady_clock::now() - start > LONG_ENOUGH)
             return false;
-        usleep(100);
+        usleep(100); // between two looks, to leave the processor to who is being waited for
     }
     return true;
 }
