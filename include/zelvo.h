@@ -115,6 +115,7 @@
 #include "ZlvLevelFilter.h"
 #include "ZlvListenerGroup.h"
 #include "ZlvLogManager.h"
+#include "ZlvLoggable.h"
 #include "ZlvLogger.h"
 #include "ZlvMisc.h"
 #include "ZlvMsgIdFilter.h"

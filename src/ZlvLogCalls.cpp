@@ -3,6 +3,7 @@
 // argument list, so that a refused call costs a few loads.
 #include "ZlvLogger.h"
 
+#include "ZlvLoggable.h"
 #include "ZlvLoggerIntl.h"
 #include "ZlvOwned.h"
 
@@ -29,7 +30,7 @@ ZlvStatus logDebug(ZlvObject *logger, ZlvLevel level, const char *srcFile, const
 
 // The body of a variadic call: LAST is its last named parameter, CALL the call that uses `args`.
 #define ZLV_LOG_VARIADIC(LEVEL, LAST, CALL)                                                        \
-    if (!isLoggable(logger, LEVEL))                                                                \
+    if (!ZlvIsLoggableInline(logger, LEVEL))                                                       \
         return NO_ERROR;                                                                           \
     va_list args;                                                                                  \
     va_start(args, LAST);                                                                          \
@@ -45,8 +46,8 @@ ZlvStatus logDebug(ZlvObject *logger, ZlvLevel level, const char *srcFile, const
     }                                                                                              \
     ZlvStatus NAME##VA(ZlvObject *logger, const char *bundle, const char *key, va_list args)       \
     {                                                                                              \
-        return isLoggable(logger, LEVEL) ? logMessage(logger, LEVEL, bundle, key, args)            \
-                                         : NO_ERROR;                                               \
+        return ZlvIsLoggableInline(logger, LEVEL) ? logMessage(logger, LEVEL, bundle, key, args)   \
+                                                  : NO_ERROR;                                      \
     }
 
 // Both forms of a call that logs a text with its place in the source.
@@ -60,7 +61,7 @@ ZlvStatus logDebug(ZlvObject *logger, ZlvLevel level, const char *srcFile, const
     ZlvStatus NAME##VA(ZlvObject *logger, const char *srcFile, const char *srcFunction,            \
                        int32_t srcLine, const UChar *text, va_list args)                           \
     {                                                                                              \
-        return isLoggable(logger, LEVEL)                                                           \
+        return ZlvIsLoggableInline(logger, LEVEL)                                                  \
                    ? logDebug(logger, LEVEL, srcFile, srcFunction, srcLine, text, args)            \
                    : NO_ERROR;                                                                     \
     }
@@ -82,7 +83,7 @@ ZlvStatus ZlvLogUText(ZlvObject *logger, const UChar *text, ...)
 
 ZlvStatus ZlvLogUTextVA(ZlvObject *logger, const UChar *text, va_list args)
 {
-    return isLoggable(logger, ZLV_LEVEL_NONE)
+    return ZlvIsLoggableInline(logger, ZLV_LEVEL_NONE)
                ? logDebug(logger, ZLV_LEVEL_NONE, nullptr, nullptr, 0, text, args)
                : NO_ERROR;
 }

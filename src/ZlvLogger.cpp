@@ -4,6 +4,7 @@
 #include "ZlvLogger.h"
 
 #include "ZlvApiMutex.h"
+#include "ZlvLoggable.h"
 #include "ZlvLoggerIntl.h"
 
 using namespace zelvo;
@@ -36,7 +37,7 @@ void addSource(ZlvEvent *event, const char *srcFile, const char *srcFunction, in
 
 int32_t ZlvIsLoggable(ZlvObject *logger, ZlvLevel level)
 {
-    return isLoggable(logger, level) ? 1 : 0;
+    return ZlvIsLoggableInline(logger, level);
 }
 
 int32_t zlvIntlIsLoggable(void)

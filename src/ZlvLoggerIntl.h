@@ -12,17 +12,6 @@ namespace zelvo {
 /// What a logging call answers as long as nothing has failed, a refusal included.
 inline constexpr ZlvStatus NO_ERROR{CX_STATUS_OK, 0, 0};
 
-/// The test behind ZlvIsLoggable(), inline because a refused logging call consists of nothing else.
-inline bool isLoggable(const ZlvObject *logger, ZlvLevel level)
-{
-    if (logger == nullptr || !loadRelaxed(logger->enabled))
-        return false;
-    if (level == ZLV_LEVEL_NONE)
-        return true;
-    const ZlvLevel threshold = loadRelaxed(logger->logger.level);
-    return threshold == ZLV_LEVEL_NONE || level >= threshold;
-}
-
 /// Brings a threshold in step with the object's "level" property if that is what has changed, and
 /// leaves every other name to the basic object.
 inline void followLevelChange(ZlvObject *object, const char *propertyName, ZlvLevel &threshold)

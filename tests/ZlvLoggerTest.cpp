@@ -3,6 +3,7 @@
 #include "ZlvLogger.h"
 
 #include <atomic>
+#include <string>
 #include <thread>
 
 #include "support/BrokenMutex.h"
@@ -52,6 +53,23 @@ TEST_F(ZlvLogger, PassesEventsWithoutLevelEvenWhenOff)
     ZlvLogUText(app_, u"text");
     ZlvLogFatal(app_, nullptr, nullptr);
     EXPECT_EQ(records().size(), 2u);
+}
+
+TEST_F(ZlvLogger, InlineTestAnswersAsTheFunctionForEveryThresholdLevelAndState)
+{
+    const ZlvLevel levels[] = {-5, 0, 2000, 3000, 4000, 7000, INT32_MAX, ZLV_LEVEL_NONE};
+    int accepted = 0;
+    for (const ZlvBool enabled : {ZlvBool{0}, ZlvBool{1}})
+        for (const ZlvLevel threshold : levels)
+            for (const ZlvLevel level : levels) {
+                ZlvSetObjectEnabled(app_, enabled);
+                setProp(app_, "level", std::to_string(threshold).c_str());
+                EXPECT_EQ(ZlvIsLoggableInline(app_, level), ZlvIsLoggable(app_, level));
+                accepted += ZlvIsLoggableInline(app_, level);
+            }
+    EXPECT_GT(accepted, 8);
+    EXPECT_LT(accepted, 64);
+    EXPECT_EQ(ZlvIsLoggableInline(nullptr, ZLV_LEVEL_FATAL), 0);
 }
 
 TEST_F(ZlvLogger, LevelComparesAsASignedNumber)
