@@ -8,12 +8,13 @@
 #include <utility>
 
 #include <unicode/uchar.h>
-#include <unicode/umsg.h>
 #include <unicode/ustring.h>
 
 #include "ZlvApiMutex.h"
 #include "ZlvBundlePattern.h"
 #include "ZlvIcuText.h"
+#include "ZlvMessageFormat.h"
+#include "ZlvPlainPattern.h"
 
 namespace zelvo {
 namespace {
@@ -23,12 +24,14 @@ constexpr int64_t ZERO_ARGUMENTS = 64;
 
 UChar *formatted(ZlvI18Msg *message, const UChar *pattern, va_list args)
 {
+    const MessageFormat format{pattern, message->locale};
+    if (format.get() == nullptr)
+        return nullptr;
     UErrorCode status = U_ZERO_ERROR;
     UChar *text = icuText(
         [&](UChar *area, int32_t capacity, UErrorCode *error) {
             ArgList own{args};
-            return u_vformatMessage(message->locale, pattern, u_strlen(pattern), area, capacity,
-                                    own.list, error);
+            return umsg_vformat(format.get(), area, capacity, own.list, error);
         },
         &status);
     if (U_FAILURE(status))
@@ -118,9 +121,16 @@ using namespace zelvo;
 UChar *zlvIntlBindUI18Msg(ZlvI18Msg *message, va_list args)
 {
     return bind(message, [&](const UChar *pattern) {
+        const PlainPattern plain{pattern};
+        if (plain.isPlain() && !plain.takesArguments())
+            return plain.bind(nullptr, args);
         const bool takesNone = u_strchr(pattern, u'{') == nullptr;
-        return takesNone || isAbsent(args) ? formattedWithZeros(message, pattern)
-                                           : formatted(message, pattern, args);
+        if (takesNone || isAbsent(args))
+            return formattedWithZeros(message, pattern);
+        const IntegerText *integers =
+            plain.takesIntegers() ? integerText(message->locale) : nullptr;
+        const bool isDirect = plain.isPlain() && (integers != nullptr || !plain.takesIntegers());
+        return isDirect ? plain.bind(integers, args) : formatted(message, pattern, args);
     });
 }
 

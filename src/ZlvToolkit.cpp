@@ -3,6 +3,7 @@
 #include "ZlvApiMutex.h"
 #include "ZlvBuiltinClasses.h"
 #include "ZlvDeferredFree.h"
+#include "ZlvKept.h"
 #include "ZlvOwned.h"
 #include "ZlvToolkitIntl.h"
 
@@ -57,6 +58,7 @@ void closeLocked()
     zlvFreeInstancesMap();
     zelvo::freeDeferred();
     zelvo::freeClasses();
+    zelvo::dropKept();
     ZLV_TK_ISOPEN = 0;
     closing = false;
 }

@@ -2,15 +2,19 @@
 // Conversions between byte strings and UTF-16 strings.
 #include "CxUString.h"
 
+#include <cstring>
+
 #include <unicode/ustdio.h>
 #include <unicode/ustring.h>
 
+#include "CxAscii.h"
+#include "CxDecimal.h"
 #include "CxMemory.h"
 #include "CxStatusIntl.h"
 #include "CxString.h"
 #include "ZlvParm.h"
 
-static constexpr size_t BYTES_PER_UNIT = 4;
+static constexpr size_t MOST_BYTES_PER_UNIT = 4;
 
 static size_t lengthOf(const UChar *str)
 {
@@ -24,20 +28,37 @@ static UChar *allocUnits(size_t length)
 
 UChar *CxUStringDupStrToUChar(const char *str)
 {
-    UChar *copy = str == nullptr ? nullptr : allocUnits(RkoStringLen(str));
-    return copy == nullptr ? nullptr : u_uastrcpy(copy, str);
+    const size_t length = RkoStringLen(str);
+    UChar *copy = str == nullptr ? nullptr : allocUnits(length);
+    if (copy == nullptr)
+        return nullptr;
+    if (!zelvo::isCopiedPlainly(str, length))
+        return u_uastrcpy(copy, str);
+    zelvo::copyAscii(copy, str, length + 1);
+    return copy;
 }
 
 char *CxUStringDupUCharToStr(const UChar *str)
 {
-    void *copy = str == nullptr ? nullptr : RkoMemoryMalloc(BYTES_PER_UNIT * (lengthOf(str) + 1));
-    return copy == nullptr ? nullptr : u_austrcpy(static_cast<char *>(copy), str);
+    if (str == nullptr)
+        return nullptr;
+    const size_t length = lengthOf(str);
+    const bool isPlain = zelvo::isCopiedPlainly(str, length);
+    const size_t bytesPerUnit = isPlain ? 1 : MOST_BYTES_PER_UNIT;
+    auto *copy = static_cast<char *>(RkoMemoryMalloc(bytesPerUnit * (length + 1)));
+    if (copy == nullptr || !isPlain)
+        return copy == nullptr ? nullptr : u_austrcpy(copy, str);
+    zelvo::copyAscii(copy, str, length + 1);
+    return copy;
 }
 
 UChar *CxUStringDup(const UChar *str)
 {
-    UChar *copy = str == nullptr ? nullptr : allocUnits(lengthOf(str));
-    return copy == nullptr ? nullptr : u_strcpy(copy, str);
+    const size_t length = str == nullptr ? 0 : lengthOf(str);
+    UChar *copy = str == nullptr ? nullptr : allocUnits(length);
+    if (copy != nullptr)
+        std::memcpy(copy, str, (length + 1) * sizeof(UChar));
+    return copy;
 }
 
 namespace {
@@ -61,7 +82,8 @@ static void formatParm(ParmText &text, const ZlvParm &parm)
         break;
     case ZLV_PARM_INT:
     case ZLV_PARM_LONG:
-        u_snprintf(text, NUMBER_LIMIT, "%d", parm.value.intValue);
+        u_charsToUChars(zelvo::decimalText(parm.value.intValue).text, text,
+                        zelvo::DecimalText::SIZE);
         break;
     case ZLV_PARM_FLOAT:
         u_snprintf(text, NUMBER_LIMIT, "%f", static_cast<double>(parm.value.floatValue));

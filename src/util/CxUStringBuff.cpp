@@ -3,18 +3,19 @@
 // the growth is made in bytes.
 #include "CxUStringBuff.h"
 
-#include <unicode/umsg.h>
 #include <unicode/ustring.h>
 
+#include "CxAscii.h"
 #include "CxDecimal.h"
 #include "CxGrowth.h"
 #include "CxMemory.h"
+#include "CxNumberText.h"
 #include "CxOwned.h"
+#include "CxString.h"
 #include "CxStringBuff.h"
 #include "CxUString.h"
 
 static constexpr uint32_t FIRST_CAPACITY = 1024;
-static constexpr int32_t NUMBER_AREA = 32;
 
 ZlvBool cxUStringBuffHasCapacity(CxUStringBuff *buff, uint32_t extra)
 {
@@ -48,10 +49,24 @@ ZlvBool CxUStringBuffAppendUStr(CxUStringBuff *buff, const UChar *str)
     return true;
 }
 
+/// Appends bytes whose conversion is a copy, without a copy in between.
+static bool appendPlain(CxUStringBuff *buff, const char *str, size_t length)
+{
+    const auto count = static_cast<uint32_t>(length);
+    if (count != length || !cxUStringBuffHasCapacity(buff, count))
+        return false;
+    zelvo::copyAscii(buff->data + buff->length, str, length + 1);
+    buff->length += count;
+    return true;
+}
+
 ZlvBool CxUStringBuffAppendStr(CxUStringBuff *buff, const char *str)
 {
-    if (buff == nullptr)
+    if (buff == nullptr || str == nullptr)
         return false;
+    const size_t length = RkoStringLen(str);
+    if (zelvo::isCopiedPlainly(str, length))
+        return appendPlain(buff, str, length);
     const zelvo::OwnedUStr converted{CxUStringDupStrToUChar(str)};
     return CxUStringBuffAppendUStr(buff, converted.get());
 }
@@ -91,32 +106,20 @@ ZlvBool CxUStringBuffAppendUInt64(CxUStringBuff *buff, uint64_t value)
     return CxUStringBuffAppendUStr(buff, text);
 }
 
-/// Appends one number formatted by a message pattern in the default locale, unless its text and
-/// terminator need more than the area.
-static bool appendNumber(CxUStringBuff *buff, const char *asciiPattern, double value)
+static bool appendNumber(CxUStringBuff *buff, zelvo::NumberForm form, double value)
 {
-    UChar pattern[NUMBER_AREA];
-    UChar text[NUMBER_AREA];
-    u_uastrcpy(pattern, asciiPattern);
-    const int32_t patternLength = u_strlen(pattern);
-    UErrorCode status = U_ZERO_ERROR;
-    const int32_t length =
-        u_formatMessage(nullptr, pattern, patternLength, nullptr, 0, &status, value);
-    if (status != U_BUFFER_OVERFLOW_ERROR || length >= NUMBER_AREA)
-        return false;
-    status = U_ZERO_ERROR;
-    u_formatMessage(nullptr, pattern, patternLength, text, length + 1, &status, value);
-    return U_SUCCESS(status) && CxUStringBuffAppendUStr(buff, text);
+    zelvo::NumberText number;
+    return zelvo::writeNumber(form, value, number) && CxUStringBuffAppendUStr(buff, number.text);
 }
 
 ZlvBool CxUStringBuffAppendUDate(CxUStringBuff *buff, UDate value)
 {
-    return appendNumber(buff, "{0,number,#}", value);
+    return appendNumber(buff, zelvo::NumberForm::WHOLE, value);
 }
 
 ZlvBool CxUStringBuffAppendUDouble(CxUStringBuff *buff, double value)
 {
-    return appendNumber(buff, "{0,number,#.#####}", value);
+    return appendNumber(buff, zelvo::NumberForm::FRACTION, value);
 }
 
 UChar *CxUStringBuffTakeUStr(CxUStringBuff *buff)

@@ -255,25 +255,37 @@ TEST(CxUStringBuffFailure, AFailedGrowthLeavesTheBufferAsItWas)
     EXPECT_TRUE(buff.terminated());
 }
 
-// A full buffer: each append of bytes allocates copies of them and then grows. Whichever of these
-// allocations fails, the append is false and the text stays.
-TEST(CxUStringBuffFailure, AnAppendOfBytesFailsWithAnyOfItsAllocations)
+// A full buffer: an append of bytes grows it, and some first make copies of the bytes. Whichever of
+// these allocations fails, the append is false and the text stays.
+template <class Append>
+void expectFailureOfEachAllocation(uint32_t allocations, Append append)
 {
-    for (uint32_t allowed = 0; allowed < 2; ++allowed) {
+    for (uint32_t allowed = 0; allowed <= allocations; ++allowed) {
         UBuff buff;
         ASSERT_TRUE(fill(buff, 511));
-        {
-            FailAlloc fail(allowed);
-            EXPECT_EQ(CxUStringBuffAppendStr(&buff, "a"), 0) << allowed;
-        }
-        {
-            FailAlloc fail(allowed);
-            EXPECT_EQ(CxUStringBuffAppendStrN(&buff, "a", 1), 0) << allowed;
-        }
         FailAlloc fail(allowed);
-        EXPECT_EQ(CxUStringBuffAppendChar(&buff, 'a'), 0) << allowed;
-        EXPECT_EQ(buff.text(), std::u16string(511, u'x'));
+        const bool isAppended = append(&buff) != 0;
+        EXPECT_EQ(isAppended, allowed == allocations) << allowed;
+        EXPECT_EQ(buff.text().size(), isAppended ? 512U : 511U) << allowed;
     }
+}
+
+TEST(CxUStringBuffFailure, AnAppendOfAsciiFailsWithItsOnlyAllocation)
+{
+    expectFailureOfEachAllocation(1, [](UBuff *buff) { return CxUStringBuffAppendStr(buff, "a"); });
+    expectFailureOfEachAllocation(1,
+                                  [](UBuff *buff) { return CxUStringBuffAppendChar(buff, 'a'); });
+}
+
+TEST(CxUStringBuffFailure, AnAppendOfOtherBytesFailsWithEitherOfItsAllocations)
+{
+    expectFailureOfEachAllocation(2, [](UBuff *buff) { return CxUStringBuffAppendStr(buff, "é"); });
+}
+
+TEST(CxUStringBuffFailure, AnAppendOfSoManyBytesFailsWithEitherOfItsAllocations)
+{
+    expectFailureOfEachAllocation(
+        2, [](UBuff *buff) { return CxUStringBuffAppendStrN(buff, "a", 1); });
 }
 
 } // namespace
