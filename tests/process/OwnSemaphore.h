@@ -29,6 +29,14 @@ public:
     /// Makes the set with its semaphore held, by nobody who could die.
     void makeHeld() const { semget(key(), 1, IPC_CREAT | 0666); }
 
+    /// Makes the set as a handler does, unless it is there.
+    void makeFree() const
+    {
+        const int made = semget(key(), 1, IPC_CREAT | IPC_EXCL | 0666);
+        if (made != -1)
+            semctl(made, 0, SETVAL, 1);
+    }
+
     /// Takes the semaphore as a process that gives it back when it dies.
     bool take() const
     {

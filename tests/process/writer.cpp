@@ -10,23 +10,11 @@
 #include <unistd.h>
 
 #include "process/Job.h"
-#include "process/Records.h"
-#include "zelvo.h"
+#include "process/RecordLogger.h"
 
 using namespace zelvo_test;
 
 namespace {
-
-/// The message and a line feed: a cheap formatter leaves more time to meet other processes.
-UChar *formatLine(ZlvObject *, ZlvEvent *event, va_list args)
-{
-    UChar *text = ZlvBindEventUMsg(event, zlvIntlBindUI18Msg, args);
-    CxUStringBuff line{};
-    CxUStringBuffAppendUStr(&line, text);
-    CxUStringBuffAppendUStr(&line, u"\n");
-    RkoMemoryFree(text);
-    return CxUStringBuffTakeUStr(&line);
-}
 
 Progress *mapProgress(const std::string &file)
 {
@@ -54,32 +42,6 @@ void awaitStart()
     }
 }
 
-/// A logger whose listener writes to the shared file.
-ZlvObject *makeLogger(const Job &job)
-{
-    ZlvAddUFormatterClass("line_formatter", nullptr, nullptr, nullptr, nullptr, formatLine, nullptr,
-                          nullptr, nullptr);
-    ZlvObject *logger = ZlvGetObject("writer.log", "zlv_basiclogger");
-    ZlvObject *handler = ZlvGetObject("writer.file", "zlv_multiproc_filehandler");
-    ZlvObject *formatter = ZlvGetObject("writer.line", "line_formatter");
-    ZlvHandlerSetFormatter(handler, formatter);
-    ZlvSetObjProp(handler, "fileName", job.file.c_str());
-    ZlvSetObjPropInt(handler, "maxFileBytes", job.maxBytes);
-    ZlvSetObjPropInt(handler, "maxFiles", job.maxFiles);
-    ZlvSetObjPropInt(handler, "MPFileSemKey", job.key);
-    ZlvAddListener(logger, handler);
-    ZlvReleaseObject(formatter);
-    ZlvReleaseObject(handler);
-    return logger;
-}
-
-bool logRecord(ZlvObject *logger, const Job &job, uint32_t number)
-{
-    const std::string text = recordText(job.seed, job.writer, number);
-    const std::u16string wide(text.begin(), text.end());
-    return ZlvLogUText(logger, u"{0}", wide.c_str()).type == CX_STATUS_OK;
-}
-
 /// Goes on behind the last record that a writer of this progress has begun.
 WriterResult logRecords(ZlvObject *logger, const Job &job, Progress &progress)
 {
@@ -103,7 +65,7 @@ int main(int argc, char **argv)
     Progress *progress = mapProgress(job.progress);
     if (progress == nullptr || !ZlvOpenToolkit(nullptr, nullptr))
         return WRITER_UNUSABLE;
-    ZlvObject *logger = makeLogger(job);
+    ZlvObject *logger = makeRecordLogger("zlv_multiproc_filehandler", job);
     awaitStart();
     if (job.signalMicros != 0)
         startSignals(job.signalMicros);
