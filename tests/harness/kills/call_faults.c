@@ -1,0 +1,162 @@
+/* SPDX-License-Identifier: Apache-2.0 */
+#define _GNU_SOURCE
+#include "CallFaults.h"
+
+#include <errno.h>
+#include <fcntl.h>
+#include <signal.h>
+#include <stdarg.h>
+#include <stddef.h>
+#include <sys/ipc.h>
+#include <sys/sem.h>
+#include <sys/stat.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+static struct CallTrace *trace;
+static uint32_t chosen;
+static enum CallFault itsFault;
+
+void plotCallFault(struct CallTrace *shared, uint32_t number, enum CallFault fault)
+{
+    chosen = number;
+    itsFault = fault;
+    trace = shared;
+}
+
+/* Numbers a call, and gives what is to become of it. */
+static enum CallFault meet(enum FaultyCall call)
+{
+    if (trace == NULL)
+        return FAULT_NONE;
+    if (trace->count < MOST_CALLS)
+        trace->calls[trace->count] = (uint8_t)call;
+    return ++trace->count == chosen ? itsFault : FAULT_NONE;
+}
+
+/* Fails instead of the call; the answer of a call that fails. */
+static int fail(int code)
+{
+    errno = code;
+    return -1;
+}
+
+/* The body of a function: the call between what befalls it. */
+#define MAKE(TYPE, CALL, FAILURE, MADE)                                                            \
+    const enum CallFault fault = meet(CALL);                                                       \
+    if (fault == FAULT_KILL_BEFORE)                                                                \
+        raise(SIGKILL);                                                                            \
+    if (fault == FAULT_FAIL)                                                                       \
+        return FAILURE;                                                                            \
+    const TYPE result = (TYPE)(MADE);                                                              \
+    if (fault == FAULT_KILL_WITHIN || fault == FAULT_KILL_AFTER)                                   \
+        raise(SIGKILL);                                                                            \
+    return result
+
+int stat(const char *path, struct stat *facts)
+{
+    MAKE(int, CALL_STAT, fail(EIO), syscall(SYS_newfstatat, AT_FDCWD, path, facts, 0));
+}
+
+int fstat(int descriptor, struct stat *facts)
+{
+    MAKE(int, CALL_FSTAT, fail(EIO), syscall(SYS_newfstatat, descriptor, "", facts, AT_EMPTY_PATH));
+}
+
+int open(const char *path, int flags, ...)
+{
+    va_list rest;
+    va_start(rest, flags);
+    const mode_t mode = va_arg(rest, mode_t);
+    va_end(rest);
+    MAKE(int, CALL_OPEN, fail(EIO), syscall(SYS_openat, AT_FDCWD, path, flags, mode));
+}
+
+ssize_t read(int descriptor, void *bytes, size_t length)
+{
+    MAKE(ssize_t, CALL_READ, fail(EIO), syscall(SYS_read, descriptor, bytes, length));
+}
+
+static size_t lengthToWrite(size_t length)
+{
+    const int isCut = trace != NULL && trace->count + 1 == chosen && itsFault == FAULT_KILL_WITHIN;
+    return isCut ? length / 2 : length;
+}
+
+ssize_t write(int descriptor, const void *bytes, size_t whole)
+{
+    const size_t length = lengthToWrite(whole);
+    MAKE(ssize_t, CALL_WRITE, fail(EIO), syscall(SYS_write, descriptor, bytes, length));
+}
+
+off_t lseek(int descriptor, off_t offset, int whence)
+{
+    MAKE(off_t, CALL_LSEEK, fail(EIO), syscall(SYS_lseek, descriptor, offset, whence));
+}
+
+int ftruncate(int descriptor, off_t length)
+{
+    MAKE(int, CALL_FTRUNCATE, fail(EIO), syscall(SYS_ftruncate, descriptor, length));
+}
+
+int fsync(int descriptor)
+{
+    MAKE(int, CALL_FSYNC, fail(EIO), syscall(SYS_fsync, descriptor));
+}
+
+int close(int descriptor)
+{
+    MAKE(int, CALL_CLOSE, fail(EIO), syscall(SYS_close, descriptor));
+}
+
+static long removeAny(const char *path)
+{
+    const long result = syscall(SYS_unlink, path);
+    return result == -1 && errno == EISDIR ? syscall(SYS_rmdir, path) : result;
+}
+
+int remove(const char *path)
+{
+    MAKE(int, CALL_REMOVE, fail(EIO), removeAny(path));
+}
+
+int rename(const char *from, const char *to)
+{
+    MAKE(int, CALL_RENAME, fail(EIO), syscall(SYS_rename, from, to));
+}
+
+int mkdir(const char *path, mode_t mode)
+{
+    MAKE(int, CALL_MKDIR, fail(EIO), syscall(SYS_mkdir, path, mode));
+}
+
+int chmod(const char *path, mode_t mode)
+{
+    MAKE(int, CALL_CHMOD, fail(EIO), syscall(SYS_chmod, path, mode));
+}
+
+int semget(key_t key, int count, int flags)
+{
+    MAKE(int, CALL_SEMGET, fail(ENOSPC), syscall(SYS_semget, key, count, flags));
+}
+
+/* Somebody removes the set; the answer of the call that finds it gone. */
+static int failWithoutSet(int id)
+{
+    syscall(SYS_semctl, id, 0, IPC_RMID, NULL);
+    return fail(EIDRM);
+}
+
+int semctl(int id, int number, int command, ...)
+{
+    va_list rest;
+    va_start(rest, command);
+    void *argument = va_arg(rest, void *);
+    va_end(rest);
+    MAKE(int, CALL_SEMCTL, failWithoutSet(id), syscall(SYS_semctl, id, number, command, argument));
+}
+
+int semop(int id, struct sembuf *steps, size_t count)
+{
+    MAKE(int, CALL_SEMOP, failWithoutSet(id), syscall(SYS_semop, id, steps, count));
+}
