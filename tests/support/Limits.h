@@ -60,7 +60,7 @@ public:
     {
         std::filesystem::create_directory("disk");
         mounted_ = unshare(CLONE_NEWNS) == 0 &&
-                   mount("none", "/", nullptr, MS_REC | MS_PRIVATE, nullptr) == 0 &&
+                   mount("none", "/", "", MS_REC | MS_PRIVATE, nullptr) == 0 &&
                    mount("none", "disk", "tmpfs", 0, "size=64k") == 0;
     }
     SmallDisk(const SmallDisk &) = delete;
