@@ -70,8 +70,7 @@ UChar *ZlvBasicUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_list 
         return nullptr;
     Record record;
     CxUStringBuff *out = record.text();
-    const OwnedUStr date{ZlvBasicUFormatterFormatDate(formatter, ZlvGetEventTime(event))};
-    CxUStringBuffAppendUStr(out, date.get());
+    appendDate(out, formatter->formatter.dateTimeFormat, ZlvGetEventTime(event));
     separate(out, formatter);
     for (const char *property : PROPERTIES_BEFORE_LINE)
         addField(out, formatter, event, property);
@@ -81,7 +80,7 @@ UChar *ZlvBasicUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_list 
         addField(out, formatter, event, property);
     const OwnedUStr message{boundMessage(formatter, event, bind, args)};
     CxUStringBuffAppendUStr(out, message.get());
-    CxUStringBuffAppendUStr(out, u"\n");
+    append(out, u"\n");
     return record.take();
 }
 
@@ -99,6 +98,8 @@ UChar *ZlvBasicUFormatterFormatDate(ZlvObject *formatter, double time)
 {
     if (formatter == nullptr)
         return nullptr;
-    UChar *date = dateText(formatter->formatter.dateTimeFormat, time);
-    return date != nullptr ? date : CxUStringDup(u"");
+    Record date;
+    appendDate(date.text(), formatter->formatter.dateTimeFormat, time);
+    UChar *text = date.take();
+    return text != nullptr ? text : CxUStringDup(u"");
 }

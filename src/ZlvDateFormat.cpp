@@ -7,7 +7,6 @@
 
 #include "CxUString.h"
 #include "ZlvIcuText.h"
-#include "ZlvRecord.h"
 #include "util/CxOwned.h"
 
 namespace zelvo {
@@ -87,15 +86,11 @@ bool DateFormat::isWhole() const
     return format_ != nullptr && (calendar_ != nullptr || !showsZone_);
 }
 
-UChar *DateFormat::text(UDate time) const
+void DateFormat::append(CxUStringBuff *out, UDate time) const
 {
-    OwnedUStr date{rendered(format_, time)};
-    if (!date || !showsZone_)
-        return date.take();
-    Record whole;
-    CxUStringBuffAppendUStr(whole.text(), date.get());
-    addZoneSuffix(whole.text(), calendar_ != nullptr ? zoneOffset(calendar_, time) : 0);
-    return whole.take();
+    const OwnedUStr date{rendered(format_, time)};
+    if (CxUStringBuffAppendUStr(out, date.get()) != 0 && showsZone_)
+        addZoneSuffix(out, calendar_ != nullptr ? zoneOffset(calendar_, time) : 0);
 }
 
 } // namespace zelvo

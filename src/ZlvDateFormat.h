@@ -5,6 +5,8 @@
 #include <unicode/ucal.h>
 #include <unicode/udat.h>
 
+#include "CxUStringBuff.h"
+
 namespace zelvo {
 
 /// A form of dates in the default locale and zone, as long as it is open.
@@ -18,8 +20,8 @@ public:
     /// Tells whether it is open in all its parts: without the calendar it shows UTC.
     bool isWhole() const;
 
-    /// The text of a time, freed by the caller; null when ICU writes none or memory ran out.
-    UChar *text(UDate time) const;
+    /// Appends a time; nothing when ICU writes nothing or memory ran out.
+    void append(CxUStringBuff *out, UDate time) const;
 
 private:
     bool openDefaultForm();

@@ -15,9 +15,9 @@
 #include <sys/stat.h>
 
 #include "CxString.h"
-#include "CxUString.h"
 #include "ZlvFileHandlerIntl.h"
 #include "ZlvIntl.h"
+#include "util/CxBytes.h"
 #include "util/CxFileIntl.h"
 #include "util/CxStatusIntl.h"
 
@@ -153,11 +153,11 @@ void makeUpForNoWrite(ZlvObject *handler)
 }
 
 /// Writes a record; its bytes are added to a size that was assumed, else the size is measured.
-CxStatus append(FileHandlerState &state, const char *record)
+CxStatus append(FileHandlerState &state, const Bytes &record)
 {
     size_t count = 0;
     const CxStatus status =
-        reported(CxFileWrite(&state.vars.file, record, RkoStringLen(record), &count));
+        reported(CxFileWrite(&state.vars.file, record.get(), record.length(), &count));
     if (isOk(status) && state.sizeAssumed)
         state.vars.currentSize += count;
     else if (isOk(status))
@@ -171,7 +171,7 @@ bool isFoundClosed(const FileHandlerState &state, CxStatus status)
     return status.code == EBADF && state.vars.isOpen != 0 && state.sizeAssumed;
 }
 
-CxStatus writeRecord(ZlvObject *handler, const char *record)
+CxStatus writeRecord(ZlvObject *handler, const Bytes &record)
 {
     FileHandlerState *state = stateOf(handler);
     if (state == nullptr)
@@ -186,9 +186,9 @@ CxStatus writeRecord(ZlvObject *handler, const char *record)
 
 CxStatus writeText(ZlvObject *handler, const UChar *text)
 {
-    const OwnedStr record{CxUStringDupUCharToStr(text)};
-    if (record)
-        return writeRecord(handler, record.get());
+    const Bytes record{text};
+    if (record.get() != nullptr)
+        return writeRecord(handler, record);
     makeUpForNoWrite(handler);
     return text != nullptr ? reported(platformError(ENOMEM)) : success;
 }

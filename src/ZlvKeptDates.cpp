@@ -69,20 +69,22 @@ KeptDate *keptDate(const char *pattern)
     return isFresh || fill(date, pattern, locale, zone) ? &date : nullptr;
 }
 
-UChar *dateFromScratch(const char *pattern, UDate time)
+void appendFromScratch(CxUStringBuff *out, const char *pattern, UDate time)
 {
     DateFormat format;
-    UChar *text = format.open(pattern) ? format.text(time) : nullptr;
+    if (format.open(pattern))
+        format.append(out, time);
     format.close();
-    return text;
 }
 
 } // namespace
 
-UChar *dateText(const char *pattern, UDate time)
+void appendDate(CxUStringBuff *out, const char *pattern, UDate time)
 {
-    KeptDate *date = ZELVO_KEEP != 0 ? keptDate(pattern) : nullptr;
-    return date != nullptr ? date->second.text(date->format, time) : dateFromScratch(pattern, time);
+    if (KeptDate *date = ZELVO_KEEP != 0 ? keptDate(pattern) : nullptr)
+        date->second.append(out, date->format, time);
+    else
+        appendFromScratch(out, pattern, time);
 }
 
 void dropKeptDates()

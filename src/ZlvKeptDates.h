@@ -4,10 +4,12 @@
 
 #include <unicode/udat.h>
 
+#include "CxUStringBuff.h"
+
 namespace zelvo {
 
-/// The text of a time by an ICU date pattern or, without one, in the default form; null when there
-/// is none. The caller frees it. The API mutex is held.
-UChar *dateText(const char *pattern, UDate time);
+/// Appends a time by an ICU date pattern or, without one, in the default form; nothing when ICU
+/// writes nothing or memory ran out. The API mutex is held.
+void appendDate(CxUStringBuff *out, const char *pattern, UDate time);
 
 } // namespace zelvo

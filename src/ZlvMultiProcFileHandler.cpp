@@ -10,10 +10,9 @@
 #include <fcntl.h>
 #include <unistd.h>
 
-#include "CxString.h"
-#include "CxUString.h"
 #include "ZlvFileHandlerIntl.h"
 #include "ZlvIntl.h"
+#include "util/CxBytes.h"
 #include "util/CxStatusIntl.h"
 
 using namespace zelvo;
@@ -57,7 +56,7 @@ void saveLive(FileHandlerVars &vars)
 }
 
 /// Measures, rolls over and writes as one step among all processes; gives the first failure.
-CxStatus writeGuarded(ZlvObject *handler, FileHandlerVars &vars, const char *record)
+CxStatus writeGuarded(ZlvObject *handler, FileHandlerVars &vars, const Bytes &record)
 {
     if (zlvMultiProcFileHandlerLockSem(handler) != 1)
         return success;
@@ -66,7 +65,7 @@ CxStatus writeGuarded(ZlvObject *handler, FileHandlerVars &vars, const char *rec
         zlvMultiProcFileHandlerDoRollover(handler);
     size_t count = 0;
     const CxStatus written =
-        reported(CxFileWrite(&vars.file, record, RkoStringLen(record), &count));
+        reported(CxFileWrite(&vars.file, record.get(), record.length(), &count));
     zlvMultiProcFileHandlerUnlockSem(handler);
     return isOk(measured) ? written : measured;
 }
@@ -76,8 +75,9 @@ CxStatus writeText(ZlvObject *handler, const UChar *text)
     FileHandlerVars *vars = varsOf(handler);
     if (vars == nullptr)
         return success;
-    const OwnedStr record{CxUStringDupUCharToStr(text)};
-    return record ? writeGuarded(handler, *vars, record.get()) : reported(platformError(ENOMEM));
+    const Bytes record{text};
+    return record.get() != nullptr ? writeGuarded(handler, *vars, record)
+                                   : reported(platformError(ENOMEM));
 }
 
 bool isReady(ZlvObject *handler, const FileHandlerVars &vars)

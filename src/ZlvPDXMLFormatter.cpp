@@ -6,6 +6,7 @@
 #include "CxMemory.h"
 #include "CxString.h"
 #include "ZlvBasicFormatter.h"
+#include "ZlvKeptDates.h"
 #include "ZlvRecord.h"
 #include "util/CxOwned.h"
 
@@ -53,59 +54,59 @@ void addItems(CxUStringBuff *out, const ZlvEvent *event, const PDXMLFormatterVar
                              vars.singleComponent == 0, vars.singleProductId == 0);
 }
 
-void addLevel(CxUStringBuff *out, const UChar *before, ZlvLevel level, const UChar *after)
+void addLevel(CxUStringBuff *out, std::u16string_view before, ZlvLevel level,
+              std::u16string_view after)
 {
     if (level == ZLV_LEVEL_NONE)
         return;
-    CxUStringBuffAppendUStr(out, before);
+    append(out, before);
     zlvPDXMLEmitULevel(out, level);
-    CxUStringBuffAppendUStr(out, after);
+    append(out, after);
 }
 
 void openMessage(CxUStringBuff *out, const ZlvEvent *event, const UChar *text)
 {
     const OwnedStr id{identifierOf(event, text)};
-    CxUStringBuffAppendUStr(out, u"<Message Id=\"");
+    append(out, u"<Message Id=\"");
     if (id && *id.get() != '\0')
         CxUStringBuffAppendStr(out, id.get());
     else
-        CxUStringBuffAppendUStr(out, u"None");
+        append(out, u"None");
     addLevel(out, u"\" Severity=\"", ZlvGetEventLevel(event), u"");
-    CxUStringBuffAppendUStr(out, u"\">\n");
+    append(out, u"\">\n");
 }
 
 void openTrace(CxUStringBuff *out, const ZlvEvent *event)
 {
-    CxUStringBuffAppendUStr(out, u"<Trace");
+    append(out, u"<Trace");
     addLevel(out, u" Level=\"", ZlvGetEventLevel(event), u"\"");
-    CxUStringBuffAppendUStr(out, u">\n");
+    append(out, u">\n");
 }
 
 void addTime(CxUStringBuff *out, ZlvObject *formatter, const ZlvEvent *event)
 {
     const double time = ZlvGetEventTime(event);
-    const OwnedUStr date{ZlvBasicUFormatterFormatDate(formatter, time)};
-    CxUStringBuffAppendUStr(out, u" <Time Millis=\"");
+    append(out, u" <Time Millis=\"");
     CxUStringBuffAppendUDate(out, time);
-    CxUStringBuffAppendUStr(out, u"\">");
-    CxUStringBuffAppendUStr(out, date.get());
-    CxUStringBuffAppendUStr(out, u"</Time>\n");
+    append(out, u"\">");
+    appendDate(out, formatter->formatter.dateTimeFormat, time);
+    append(out, u"</Time>\n");
 }
 
 void addText(CxUStringBuff *out, const UChar *text)
 {
-    CxUStringBuffAppendUStr(out, u" <LogText><![CDATA[");
+    append(out, u" <LogText><![CDATA[");
     CxUStringBuffAppendUStr(out, text);
-    CxUStringBuffAppendUStr(out, u"]]></LogText>\n");
+    append(out, u"]]></LogText>\n");
 }
 
 void addAttribute(CxUStringBuff *out, const StringToStringMapNode *property)
 {
-    CxUStringBuffAppendUStr(out, u"<Key>");
+    append(out, u"<Key>");
     CxUStringBuffAppendStr(out, property->key);
-    CxUStringBuffAppendUStr(out, u"</Key><Value>");
+    append(out, u"</Key><Value>");
     CxUStringBuffAppendStr(out, property->value);
-    CxUStringBuffAppendUStr(out, u"</Value>");
+    append(out, u"</Value>");
 }
 
 void addAttributes(CxUStringBuff *out, const ZlvEvent *event)
@@ -116,18 +117,18 @@ void addAttributes(CxUStringBuff *out, const ZlvEvent *event)
         if (zlvPDXMLCheckKey(property->key) == 0)
             continue;
         if (!any)
-            CxUStringBuffAppendUStr(out, u" <LogAttribs>");
+            append(out, u" <LogAttribs>");
         any = true;
         addAttribute(out, property);
     }
     if (any)
-        CxUStringBuffAppendUStr(out, u"</LogAttribs>\n");
+        append(out, u"</LogAttribs>\n");
 }
 
 void addTraceOrigin(CxUStringBuff *out, const ZlvEvent *event)
 {
     if (zlvPDXMLEmitUSource(out, event) == 0)
-        CxUStringBuffAppendUStr(out, u" <Source FileName=\"None\" Method=\"None\"/>\n");
+        append(out, u" <Source FileName=\"None\" Method=\"None\"/>\n");
     appendNumber(out, event, "threadId", CxUStringBuffAppendInt64, u" <Thread>", u"</Thread>\n");
     appendNumber(out, event, "processId", appendSigned, u" <Process>", u"</Process>\n");
 }
@@ -194,7 +195,7 @@ UChar *ZlvPDXMLUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_list 
         addTraceOrigin(out, event);
     }
     addParties(out, event);
-    CxUStringBuffAppendUStr(out, isMessage ? u"</Message>\n" : u"</Trace>\n");
+    append(out, isMessage ? u"</Message>\n" : u"</Trace>\n");
     return record.take();
 }
 

@@ -4,7 +4,6 @@
 #include "ZlvLevelWords.h"
 #include "ZlvPDXMLFormatter.h"
 #include "ZlvRecord.h"
-#include "util/CxOwned.h"
 
 using namespace zelvo;
 
@@ -20,14 +19,14 @@ constexpr const char *placedProperties[] = {
 
 void addServer(CxUStringBuff *out, const ZlvEvent *event)
 {
-    const OwnedStr server{ZlvGetEventProp(event, "server", nullptr)};
-    if (!server)
+    const char *server = propertyOf(event, "server");
+    if (server == nullptr)
         return;
-    CxUStringBuffAppendUStr(out, u" <Server Format=\"");
+    append(out, u" <Server Format=\"");
     appendProperty(out, event, "serverFormat");
-    CxUStringBuffAppendUStr(out, u"\">");
-    CxUStringBuffAppendStr(out, server.get());
-    CxUStringBuffAppendUStr(out, u"</Server>\n");
+    append(out, u"\">");
+    CxUStringBuffAppendStr(out, server);
+    append(out, u"</Server>\n");
 }
 
 } // namespace
@@ -67,6 +66,6 @@ ZlvBool zlvPDXMLEmitUSource(CxUStringBuff *buff, const ZlvEvent *event)
         return 0;
     appendProperty(buff, event, "zlv_prop_srcfunction", u"\" Method=\"");
     appendNumber(buff, event, "zlv_prop_srcline", appendSigned, u"\" Line=\"");
-    CxUStringBuffAppendUStr(buff, u"\"/>\n");
+    append(buff, u"\"/>\n");
     return 1;
 }

@@ -26,7 +26,7 @@ void addArgument(CxUStringBuff *out, ArgKind kind, ArgList &args)
 void addZero(CxUStringBuff *out, ArgKind kind)
 {
     if (kind != ArgKind::TEXT)
-        CxUStringBuffAppendUStr(out, u"0");
+        append(out, u"0");
 }
 
 /// Shows the arguments, up to the first that is absent; ADD appends the value of one.
@@ -36,9 +36,9 @@ void addEach(CxUStringBuff *out, const ArgKinds &kinds, Add add)
     for (const ArgKind kind : kinds.of) {
         if (kind == ArgKind::ABSENT)
             return;
-        CxUStringBuffAppendUStr(out, u"<Param><![CDATA[");
+        append(out, u"<Param><![CDATA[");
         add(kind);
-        CxUStringBuffAppendUStr(out, u"]]></Param>");
+        append(out, u"]]></Param>");
     }
 }
 
@@ -64,11 +64,11 @@ void zlvPDXMLEmitUTranslationInfo(CxUStringBuff *buff, const ZlvEvent *event, va
     if (message == nullptr || message->bundle == nullptr || message->key == nullptr)
         return;
     // "Resource Bundle", with its blank, is the attribute's name to all readers of these records.
-    CxUStringBuffAppendUStr(buff, u" <TranslationInfo Resource Bundle=\"");
+    append(buff, u" <TranslationInfo Resource Bundle=\"");
     CxUStringBuffAppendStr(buff, message->bundle);
-    CxUStringBuffAppendUStr(buff, u"\" MsgKey=\"");
+    append(buff, u"\" MsgKey=\"");
     CxUStringBuffAppendStr(buff, message->key);
-    CxUStringBuffAppendUStr(buff, u"\">");
+    append(buff, u"\">");
     addArguments(buff, message, args);
-    CxUStringBuffAppendUStr(buff, u"</TranslationInfo>\n");
+    append(buff, u"</TranslationInfo>\n");
 }

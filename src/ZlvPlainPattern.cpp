@@ -139,21 +139,22 @@ UChar *PlainPattern::bind(const IntegerText *integers, va_list args) const
     Arguments arguments;
     if (takesArguments() && !arguments.read(kinds_, argumentCount_, integers, args))
         return nullptr;
-    std::u16string_view values[MOST_PIECES];
+    const auto viewOfPiece = [&](const Piece &piece) {
+        return piece.argument < 0 ? viewOf(piece.text, piece.length) : arguments[piece.argument];
+    };
     size_t length = 0;
-    for (int32_t i = 0; i < pieceCount_; ++i) {
-        const Piece &piece = pieces_[i];
-        values[i] =
-            piece.argument < 0 ? viewOf(piece.text, piece.length) : arguments[piece.argument];
-        length += values[i].size();
-    }
+    for (int32_t i = 0; i < pieceCount_; ++i)
+        length += viewOfPiece(pieces_[i]).size();
     void *area = length > 0 ? RkoMemoryMalloc((length + 1) * sizeof(UChar)) : nullptr;
     auto *text = static_cast<UChar *>(area);
+    if (text == nullptr)
+        return nullptr;
     UChar *end = text;
-    for (int32_t i = 0; text != nullptr && i < pieceCount_; ++i)
-        end = std::copy(values[i].begin(), values[i].end(), end);
-    if (text != nullptr)
-        *end = 0;
+    for (int32_t i = 0; i < pieceCount_; ++i) {
+        const std::u16string_view piece = viewOfPiece(pieces_[i]);
+        end = std::copy(piece.begin(), piece.end(), end);
+    }
+    *end = 0;
     return text;
 }
 

@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvRecord.h"
 
+#include <algorithm>
+
 #include "CxKvtID.h"
 #include "CxString.h"
 #include "CxUString.h"
+#include "ZlvPropsIntl.h"
 #include "util/CxOwned.h"
 
 namespace zelvo {
@@ -13,33 +16,50 @@ ZlvBool appendSigned(CxUStringBuff *out, int64_t value)
     const auto bits = static_cast<uint64_t>(value);
     if (value >= 0)
         return CxUStringBuffAppendUInt64(out, bits);
-    CxUStringBuffAppendUStr(out, u"-");
+    append(out, u"-");
     return CxUStringBuffAppendUInt64(out, 0 - bits);
 }
 
-bool appendProperty(CxUStringBuff *out, const ZlvEvent *event, const char *property,
-                    const UChar *before, const UChar *after)
+void append(CxUStringBuff *out, std::u16string_view text)
 {
-    const OwnedStr value{ZlvGetEventProp(event, property, nullptr)};
-    if (!value)
+    const auto count = static_cast<uint32_t>(text.size());
+    if (cxUStringBuffHasCapacity(out, count) == 0)
+        return;
+    std::copy(text.begin(), text.end(), out->data + out->length);
+    out->length += count;
+    out->data[out->length] = 0;
+}
+
+const char *propertyOf(const ZlvEvent *event, const char *property)
+{
+    const StringToStringMap *properties = event != nullptr ? event->properties : nullptr;
+    const StringToStringMapNode *node = zlvIntlStringToStringMapGetNode(properties, property);
+    return node != nullptr ? node->value : nullptr;
+}
+
+bool appendProperty(CxUStringBuff *out, const ZlvEvent *event, const char *property,
+                    std::u16string_view before, std::u16string_view after)
+{
+    const char *value = propertyOf(event, property);
+    if (value == nullptr)
         return false;
-    CxUStringBuffAppendUStr(out, before);
-    CxUStringBuffAppendStr(out, value.get());
-    CxUStringBuffAppendUStr(out, after);
+    append(out, before);
+    CxUStringBuffAppendStr(out, value);
+    append(out, after);
     return true;
 }
 
 bool appendNumber(CxUStringBuff *out, const ZlvEvent *event, const char *property,
-                  ZlvBool (*append)(CxUStringBuff *, int64_t), const UChar *before,
-                  const UChar *after)
+                  ZlvBool (*appendDecimal)(CxUStringBuff *, int64_t), std::u16string_view before,
+                  std::u16string_view after)
 {
     ZlvBool found = 0;
-    const int32_t value = ZlvGetEventPropInt(event, property, &found);
+    const int32_t value = zlvPropStrToInt32(propertyOf(event, property), &found);
     if (found == 0)
         return false;
-    CxUStringBuffAppendUStr(out, before);
-    append(out, value);
-    CxUStringBuffAppendUStr(out, after);
+    append(out, before);
+    appendDecimal(out, value);
+    append(out, after);
     return true;
 }
 

@@ -2,6 +2,8 @@
 // What the formatters share: a record under construction, and the pieces that it is made of.
 #pragma once
 
+#include <string_view>
+
 #include "CxUStringBuff.h"
 #include "ZlvIntl.h"
 
@@ -26,15 +28,21 @@ private:
 /// very large ones.)
 ZlvBool appendSigned(CxUStringBuff *out, int64_t value);
 
+/// Appends a text of known length.
+void append(CxUStringBuff *out, std::u16string_view text);
+
+/// The value of a property, which the event keeps; null when there is none.
+const char *propertyOf(const ZlvEvent *event, const char *property);
+
 /// Appends a property between two texts, if the event has it. Tells whether it has.
 bool appendProperty(CxUStringBuff *out, const ZlvEvent *event, const char *property,
-                    const UChar *before = u"", const UChar *after = u"");
+                    std::u16string_view before = u"", std::u16string_view after = u"");
 
-/// The same with a property that is a 32-bit number, which APPEND renders: appendSigned(), or
-/// CxUStringBuffAppendInt64() for numbers without sign.
+/// The same with a property that is a 32-bit number, which APPEND_DECIMAL renders: appendSigned(),
+/// or CxUStringBuffAppendInt64() for numbers without sign.
 bool appendNumber(CxUStringBuff *out, const ZlvEvent *event, const char *property,
-                  ZlvBool (*append)(CxUStringBuff *, int64_t), const UChar *before = u"",
-                  const UChar *after = u"");
+                  ZlvBool (*appendDecimal)(CxUStringBuff *, int64_t),
+                  std::u16string_view before = u"", std::u16string_view after = u"");
 
 /// Binds an event's message in the formatter's locale, if it has one, else in the event's.
 UChar *boundMessage(const ZlvObject *formatter, ZlvEvent *event, ZlvFBindMsg bind, va_list args);

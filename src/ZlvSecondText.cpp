@@ -1,14 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvSecondText.h"
 
+#include <algorithm>
 #include <cmath>
-#include <cstring>
-#include <string_view>
 
-#include <unicode/ustring.h>
-
-#include "CxMemory.h"
-#include "util/CxOwned.h"
+#include "ZlvRecord.h"
 
 namespace zelvo {
 namespace {
@@ -22,75 +18,67 @@ bool isOrdinary(UDate time)
     return time >= 0 && time < 253402300800000.0 && std::floor(time) == time;
 }
 
-std::u16string_view threeUnits(const UChar *text, int32_t position)
+std::u16string_view viewOf(Record &record)
 {
-    return {text + position, 3};
-}
-
-int32_t firstDifference(const UChar *a, const UChar *b)
-{
-    int32_t position = 0;
-    while (a[position] != 0 && a[position] == b[position])
-        ++position;
-    return position;
+    const CxUStringBuff *text = record.text();
+    return {text->data, text->length};
 }
 
 } // namespace
 
-UChar *SecondText::text(const DateFormat &format, UDate time)
+void SecondText::append(CxUStringBuff *out, const DateFormat &format, UDate time)
 {
     if (!isOrdinary(time))
-        return format.text(time);
+        return format.append(out, time);
     const auto whole = static_cast<int64_t>(time);
     if (whole / MILLISECONDS != second_) {
         second_ = whole / MILLISECONDS;
         state_ = State::SEEN_ONCE;
-        return format.text(time);
+        return format.append(out, time);
     }
     if (state_ == State::SEEN_ONCE)
         state_ = learn(format) ? State::LEARNT : State::IRREGULAR;
-    return state_ == State::LEARNT ? copy(static_cast<int32_t>(whole % MILLISECONDS))
-                                   : format.text(time);
+    if (state_ == State::IRREGULAR)
+        return format.append(out, time);
+    setMilliseconds(static_cast<int32_t>(whole % MILLISECONDS));
+    zelvo::append(out, {text_, length_});
 }
 
 bool SecondText::learn(const DateFormat &format)
 {
     const auto start = static_cast<UDate>(second_ * MILLISECONDS);
-    const OwnedUStr atStart{format.text(start)};
-    const OwnedUStr atSample{format.text(start + SAMPLE)};
-    return atStart && atSample && compare(atStart.get(), atSample.get());
+    Record atStart;
+    Record atSample;
+    format.append(atStart.text(), start);
+    format.append(atSample.text(), start + SAMPLE);
+    return compare(viewOf(atStart), viewOf(atSample));
 }
 
-bool SecondText::compare(const UChar *atStart, const UChar *atSample)
+/// Keeps the text if it has the milliseconds in one place or not at all.
+bool SecondText::compare(std::u16string_view atStart, std::u16string_view atSample)
 {
-    length_ = u_strlen(atStart);
-    if (length_ >= CAPACITY || u_strlen(atSample) != length_)
+    length_ = atStart.size();
+    if (length_ == 0 || length_ > CAPACITY || atSample.size() != length_)
         return false;
-    u_strcpy(text_, atStart);
-    position_ = firstDifference(atStart, atSample);
-    if (position_ == length_) {
-        position_ = -1;
+    const auto difference = std::mismatch(atStart.begin(), atStart.end(), atSample.begin()).first;
+    milliseconds_ = static_cast<size_t>(difference - atStart.begin());
+    std::copy(atStart.begin(), atStart.end(), text_);
+    if (milliseconds_ == length_)
         return true;
-    }
-    return position_ + 3 <= length_ && threeUnits(atStart, position_) == u"000" &&
-           threeUnits(atSample, position_) == u"987" &&
-           u_strcmp(atStart + position_ + 3, atSample + position_ + 3) == 0;
+    const auto behind = milliseconds_ + 3;
+    return atStart.substr(milliseconds_, 3) == u"000" &&
+           atSample.substr(milliseconds_, 3) == u"987" &&
+           atStart.substr(behind) == atSample.substr(behind);
 }
 
-UChar *SecondText::copy(int32_t milliseconds) const
+void SecondText::setMilliseconds(int32_t milliseconds)
 {
-    const size_t size = (static_cast<size_t>(length_) + 1) * sizeof(UChar);
-    auto *text = static_cast<UChar *>(RkoMemoryMalloc(size));
-    if (text == nullptr)
-        return nullptr;
-    std::memcpy(text, text_, size);
-    if (position_ >= 0) {
-        UChar *digits = text + position_;
-        digits[0] = static_cast<UChar>(u'0' + milliseconds / 100);
-        digits[1] = static_cast<UChar>(u'0' + milliseconds / 10 % 10);
-        digits[2] = static_cast<UChar>(u'0' + milliseconds % 10);
-    }
-    return text;
+    if (milliseconds_ == length_)
+        return;
+    UChar *digits = text_ + milliseconds_;
+    digits[0] = static_cast<UChar>(u'0' + milliseconds / 100);
+    digits[1] = static_cast<UChar>(u'0' + milliseconds / 10 % 10);
+    digits[2] = static_cast<UChar>(u'0' + milliseconds % 10);
 }
 
 } // namespace zelvo

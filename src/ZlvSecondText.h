@@ -2,6 +2,8 @@
 // The text of a date within one second.
 #pragma once
 
+#include <string_view>
+
 #include "ZlvDateFormat.h"
 
 namespace zelvo {
@@ -10,22 +12,22 @@ namespace zelvo {
 /// three ASCII digits, ICU writes two of them, and the others are copies with other milliseconds.
 class SecondText {
 public:
-    /// The text of a time, as FORMAT writes it.
-    UChar *text(const DateFormat &format, UDate time);
+    /// Appends a time as FORMAT writes it.
+    void append(CxUStringBuff *out, const DateFormat &format, UDate time);
 
 private:
     enum class State : uint8_t { SEEN_ONCE, LEARNT, IRREGULAR };
 
-    static constexpr int32_t CAPACITY = 96;
+    static constexpr size_t CAPACITY = 96;
 
     bool learn(const DateFormat &format);
-    bool compare(const UChar *atStart, const UChar *atSample);
-    UChar *copy(int32_t milliseconds) const;
+    bool compare(std::u16string_view atStart, std::u16string_view atSample);
+    void setMilliseconds(int32_t milliseconds);
 
     int64_t second_ = -1;
     State state_ = State::SEEN_ONCE;
-    int32_t length_ = 0;
-    int32_t position_ = -1; ///< of the milliseconds; -1 if there are none
+    size_t length_ = 0;
+    size_t milliseconds_ = 0; ///< where they stand; at the end if there are none
     UChar text_[CAPACITY]{};
 };
 

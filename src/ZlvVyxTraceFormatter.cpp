@@ -3,7 +3,7 @@
 #include "ZlvVyxTraceFormatter.h"
 
 #include "CxString.h"
-#include "ZlvBasicFormatter.h"
+#include "ZlvKeptDates.h"
 #include "ZlvLevelWords.h"
 #include "ZlvRecord.h"
 #include "util/CxOwned.h"
@@ -14,15 +14,14 @@ namespace {
 
 void endField(CxUStringBuff *out)
 {
-    CxUStringBuffAppendUStr(out, u" - ");
+    append(out, u" - ");
 }
 
-void addDate(CxUStringBuff *out, ZlvObject *formatter, const ZlvEvent *event)
+void addDate(CxUStringBuff *out, const ZlvObject *formatter, const ZlvEvent *event)
 {
-    const OwnedUStr date{ZlvBasicUFormatterFormatDate(formatter, ZlvGetEventTime(event))};
-    CxUStringBuffAppendUStr(out, u"[");
-    CxUStringBuffAppendUStr(out, date.get());
-    CxUStringBuffAppendUStr(out, u"]");
+    append(out, u"[");
+    appendDate(out, formatter->formatter.dateTimeFormat, ZlvGetEventTime(event));
+    append(out, u"]");
 }
 
 /// Of a qualified host name only the first label is shown.
@@ -63,7 +62,7 @@ UChar *ZlvVyxTraceUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_li
         return nullptr;
     Record record;
     CxUStringBuff *out = record.text();
-    CxUStringBuffAppendUStr(out, u"\u001e");
+    append(out, u"\u001e");
     addDate(out, formatter, event);
     endField(out);
     CxUStringBuffAppendUStr(out, wordsOf(ZlvGetEventLevel(event)).field);
@@ -78,6 +77,6 @@ UChar *ZlvVyxTraceUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_li
     addIdentifier(out, event, text.get());
     endField(out);
     CxUStringBuffAppendUStr(out, text.get());
-    CxUStringBuffAppendUStr(out, u"\n");
+    append(out, u"\n");
     return record.take();
 }

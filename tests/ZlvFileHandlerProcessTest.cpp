@@ -143,14 +143,14 @@ TEST_F(ZlvFileHandlerProcess, AfterAFailedWriteReportsItAndPassesTheEventOn)
     EXPECT_EQ(Recorder::records().size(), 1u);
 }
 
-TEST_F(ZlvFileHandlerProcess, RunningOutOfMemoryForTheBytesIsAFailure)
+TEST_F(ZlvFileHandlerProcess, RunningOutOfMemoryForConvertedBytesIsAFailure)
 {
     handler("fileName", "app.log");
     log(u"before");
     bool seen = false;
     for (uint32_t allowed = 0;; ++allowed) {
         FailAlloc fail(allowed, FailAlloc::Once);
-        const ZlvStatus status = logged(u"a");
+        const ZlvStatus status = logged(u"ä");
         if (fail.failed() == 0)
             break;
         seen = seen || failed(status, ENOMEM);

@@ -167,14 +167,14 @@ TEST_F(ZlvMultiProcFileHandler, MeasuresTheFileBeforeTheRecord)
     EXPECT_EQ(vars()->currentSize, 7u);
 }
 
-TEST_F(ZlvMultiProcFileHandler, RunningOutOfMemoryForTheBytesIsAFailure)
+TEST_F(ZlvMultiProcFileHandler, RunningOutOfMemoryForConvertedBytesIsAFailure)
 {
     handler("fileName", "app.log");
     log(u"before");
     bool seen = false;
     for (uint32_t allowed = 0;; ++allowed) {
         FailAlloc fail(allowed, FailAlloc::Once);
-        const ZlvStatus status = logged(u"a");
+        const ZlvStatus status = logged(u"ä");
         if (fail.failed() == 0)
             break;
         seen = seen || failed(status, ENOMEM);

@@ -17,9 +17,10 @@ CxStatus localName(const char *name, LocalName &local)
 {
     if (name == nullptr)
         return missingArgument;
-    if (std::strlen(name) >= sizeof local.text)
+    const size_t length = std::strlen(name);
+    if (length >= sizeof local.text)
         return platformError(ENAMETOOLONG);
-    CxFileNameLocalize(name, local.text, sizeof local.text);
+    std::replace_copy(name, name + length + 1, local.text, '\\', '/');
     return success;
 }
 

@@ -24,6 +24,13 @@ public:
     T *operator->() const { return block_; }
     explicit operator bool() const { return block_ != nullptr; }
 
+    /// Takes over a block in place of the one owned so far.
+    void reset(T *block)
+    {
+        RkoMemoryFree(block_);
+        block_ = block;
+    }
+
     /// Hands the block to the caller.
     T *take()
     {

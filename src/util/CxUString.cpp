@@ -80,11 +80,6 @@ static void formatParm(ParmText &text, const ZlvParm &parm)
     case ZLV_PARM_CHAR:
         u_snprintf(text, NUMBER_LIMIT, "%c", parm.value.byteValue);
         break;
-    case ZLV_PARM_INT:
-    case ZLV_PARM_LONG:
-        u_charsToUChars(zelvo::decimalText(parm.value.intValue).text, text,
-                        zelvo::DecimalText::SIZE);
-        break;
     case ZLV_PARM_FLOAT:
         u_snprintf(text, NUMBER_LIMIT, "%f", static_cast<double>(parm.value.floatValue));
         break;
@@ -103,6 +98,8 @@ char *CxUStringParmToStr(const ZlvParm *parm)
 {
     if (parm == nullptr)
         return nullptr;
+    if (parm->type == ZLV_PARM_INT || parm->type == ZLV_PARM_LONG)
+        return RkoStringDup(zelvo::decimalText(parm->value.intValue).text);
     ParmText text = {};
     formatParm(text, *parm);
     return CxUStringDupUCharToStr(text);
