@@ -72,8 +72,13 @@ void zlvToolkitInitObjClasses(void)
     if (ZLV_TK_CLASSES != nullptr)
         return;
     ZLV_TK_CLASSES = zlvIntlAllocStringToObjClassMap();
-    for (const KindNames &row : kinds)
+    bool isWhole = ZLV_TK_CLASSES != nullptr;
+    for (const KindNames &row : kinds) {
         *row.names = zlvIntlAllocStringGroup();
+        isWhole = isWhole && *row.names != nullptr;
+    }
+    if (!isWhole)
+        return zelvo::freeClasses(); // the next call tries again
     zelvo::forEachBuiltinClass(put);
 }
 

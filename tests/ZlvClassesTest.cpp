@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The registry of classes.
+#include "support/FailAlloc.h"
 #include "support/ToolkitFixture.h"
 
 #include "CxString.h"
@@ -50,6 +51,21 @@ TEST_F(ZlvClasses, InitialisingAgainChangesNothing)
     EXPECT_EQ(ZLV_TK_CLASSES, before);
     EXPECT_EQ(zlvToolkitGetClassDef("zlv_basiclogger"), builtin);
     EXPECT_EQ(namesOf(ZLV_KIND_LOGGER), names);
+}
+
+TEST_F(ZlvClasses, WithoutMemoryForAllOfItThereIsNoRegistryAndTheNextCallMakesIt)
+{
+    for (uint32_t allowed = 0; allowed < 5; ++allowed) {
+        {
+            FailAlloc fail(allowed, FailAlloc::Once);
+            zlvToolkitInitObjClasses();
+        }
+        EXPECT_EQ(ZLV_TK_CLASSES, nullptr);
+        EXPECT_EQ(ZLV_TK_LOGGER_CLASSNAMES, nullptr);
+        EXPECT_EQ(ZLV_TK_FORMATTER_CLASSNAMES, nullptr);
+    }
+    zlvToolkitInitObjClasses();
+    EXPECT_FALSE(namesOf(ZLV_KIND_FORMATTER).empty());
 }
 
 TEST_F(ZlvClasses, AddingAClassMakesTheRegistryAndTheBuiltinClasses)
