@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Makes chosen allocations of the library fail. The linker sends every call of the three allocating
-// wrappers that crosses a source file through FailAlloc.cpp, which asks here first; allocations of
-// the C library, of ICU and of the tests are never touched.
+// wrappers that crosses a source file through FailAllocWrappers.cpp, which asks here first;
+// allocations of the C library, of ICU and of the tests are never touched.
 #pragma once
 
 #include <cstdint>
