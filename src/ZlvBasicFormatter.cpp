@@ -50,6 +50,16 @@ void addField(CxUStringBuff *out, const ZlvObject *formatter, const ZlvEvent *ev
         separate(out, formatter);
 }
 
+void addFields(CxUStringBuff *out, const ZlvObject *formatter, const ZlvEvent *event)
+{
+    for (const char *property : PROPERTIES_BEFORE_LINE)
+        addField(out, formatter, event, property);
+    if (appendNumber(out, event, "zlv_prop_srcline", appendSigned))
+        separate(out, formatter);
+    for (const char *property : PROPERTIES_AFTER_LINE)
+        addField(out, formatter, event, property);
+}
+
 } // namespace
 
 void ZlvBasicFormatterFCfgChange(ZlvObject *formatter, const char *propertyName)
@@ -72,12 +82,8 @@ UChar *ZlvBasicUFormatterFFormat(ZlvObject *formatter, ZlvEvent *event, va_list 
     CxUStringBuff *out = record.text();
     appendDate(out, formatter->formatter.dateTimeFormat, ZlvGetEventTime(event));
     separate(out, formatter);
-    for (const char *property : PROPERTIES_BEFORE_LINE)
-        addField(out, formatter, event, property);
-    if (appendNumber(out, event, "zlv_prop_srcline", appendSigned))
-        separate(out, formatter);
-    for (const char *property : PROPERTIES_AFTER_LINE)
-        addField(out, formatter, event, property);
+    if (event->properties != nullptr)
+        addFields(out, formatter, event);
     const OwnedUStr message{boundMessage(formatter, event, bind, args)};
     CxUStringBuffAppendUStr(out, message.get());
     append(out, u"\n");

@@ -1,8 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 // Pieces of an XML record that come from the event's level and properties.
-#include "CxString.h"
-#include "ZlvLevelWords.h"
 #include "ZlvPDXMLFormatter.h"
+
+#include <algorithm>
+#include <cstring>
+#include <iterator>
+
+#include "ZlvLevelWords.h"
 #include "ZlvRecord.h"
 
 using namespace zelvo;
@@ -35,10 +39,10 @@ ZlvBool zlvPDXMLCheckKey(const char *key)
 {
     if (key == nullptr)
         return 0;
-    for (const char *placed : placedProperties)
-        if (RkoStringCmp(key, placed) == 0)
-            return 0;
-    return 1;
+    const auto isIt = [key](const char *placed) {
+        return *placed == *key && std::strcmp(placed, key) == 0; // the first letter settles most
+    };
+    return std::none_of(std::begin(placedProperties), std::end(placedProperties), isIt);
 }
 
 void zlvPDXMLEmitULevel(CxUStringBuff *buff, ZlvLevel level)

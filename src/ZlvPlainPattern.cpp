@@ -16,12 +16,17 @@ constexpr std::u16string_view INTEGER_STYLE = u",number,integer}";
 
 bool startsWith(const UChar *text, std::u16string_view start)
 {
-    return u_strncmp(text, start.data(), static_cast<int32_t>(start.size())) == 0;
+    size_t i = 0;
+    while (i < start.size() && text[i] == start[i])
+        ++i;
+    return i == start.size();
 }
 
 bool isSpecial(UChar c)
 {
-    return c == 0 || c == u'\'' || c == u'{' || c == u'}';
+    // Most units are settled by the first test: nothing between the two is special.
+    const bool isOutside = c <= u'\'' || c >= u'{';
+    return isOutside && (c == 0 || c == u'\'' || c == u'{' || c == u'}');
 }
 
 std::u16string_view viewOf(const UChar *text, int32_t length)

@@ -49,8 +49,8 @@ ZlvBool CxUStringBuffAppendUStr(CxUStringBuff *buff, const UChar *str)
     return true;
 }
 
-/// Appends bytes whose conversion is a copy, without a copy in between.
-static bool appendPlain(CxUStringBuff *buff, const char *str, size_t length)
+/// Appends bytes that are all ASCII, without a copy in between.
+static bool appendAscii(CxUStringBuff *buff, const char *str, size_t length)
 {
     const auto count = static_cast<uint32_t>(length);
     if (count != length || !cxUStringBuffHasCapacity(buff, count))
@@ -66,7 +66,7 @@ ZlvBool CxUStringBuffAppendStr(CxUStringBuff *buff, const char *str)
         return false;
     const size_t length = RkoStringLen(str);
     if (zelvo::isCopiedPlainly(str, length))
-        return appendPlain(buff, str, length);
+        return appendAscii(buff, str, length);
     const zelvo::OwnedUStr converted{CxUStringDupStrToUChar(str)};
     return CxUStringBuffAppendUStr(buff, converted.get());
 }
@@ -101,9 +101,8 @@ ZlvBool CxUStringBuffAppendInt64(CxUStringBuff *buff, int64_t value)
 ZlvBool CxUStringBuffAppendUInt64(CxUStringBuff *buff, uint64_t value)
 {
     // Not u_snprintf(): its "%llu" prints the upper half of the range as negative numbers.
-    UChar text[zelvo::DecimalText::SIZE];
-    u_charsToUChars(zelvo::decimalText(value).text, text, zelvo::DecimalText::SIZE);
-    return CxUStringBuffAppendUStr(buff, text);
+    const zelvo::DecimalText decimal = zelvo::decimalText(value);
+    return appendAscii(buff, decimal.text, RkoStringLen(decimal.text));
 }
 
 static bool appendNumber(CxUStringBuff *buff, zelvo::NumberForm form, double value)
