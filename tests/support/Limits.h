@@ -53,15 +53,16 @@ inline rlim_t nextDescriptor()
     return static_cast<rlim_t>(next);
 }
 
-/// A file system in memory of 64 KiB, seen by this process alone, under the directory "disk".
+/// A small file system in memory, seen by this process and its children alone, under the directory
+/// "disk".
 class SmallDisk {
 public:
-    SmallDisk()
+    explicit SmallDisk(const char *options = "size=64k")
     {
         std::filesystem::create_directory("disk");
         mounted_ = unshare(CLONE_NEWNS) == 0 &&
                    mount("none", "/", "", MS_REC | MS_PRIVATE, nullptr) == 0 &&
-                   mount("none", "disk", "tmpfs", 0, "size=64k") == 0;
+                   mount("none", "disk", "tmpfs", 0, options) == 0;
     }
     SmallDisk(const SmallDisk &) = delete;
     SmallDisk &operator=(const SmallDisk &) = delete;
