@@ -137,9 +137,11 @@ TEST_F(ZlvKept, APatternOfABundleIsFoundAgain)
 {
     ZlvI18Msg *message = zlvIntlAllocUI18Msg(bundlePath, "plain", nullptr);
     UErrorCode status = U_ZERO_ERROR;
-    const UChar *first = zelvo::BundlePattern(message, &status).get();
-    ASSERT_NE(first, nullptr);
-    EXPECT_EQ(zelvo::BundlePattern(message, &status).get(), first);
+    EXPECT_NE(zelvo::BundlePattern(message, &status).get(), nullptr);
+    const UChar *kept = zelvo::BundlePattern(message, &status).get();
+    ASSERT_NE(kept, nullptr);
+    EXPECT_EQ(zelvo::BundlePattern(message, &status).get(), kept);
+    EXPECT_EQ(std::u16string(kept), u"Service halted");
     zlvIntlFreeI18Msg(message);
 }
 
