@@ -188,7 +188,7 @@ int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
     if (!isSetUp || expected.configs.size() > MOST_CONFIGS ||
         listenersIn(expected.configs) > MOST_LISTENERS)
         return 0;
-    bundlePattern = u"{0} bought tea for {1,number}";
+    setBundlePattern(u"{0} bought tea for {1,number}");
     file.hold(text);
     const auto body = [&] { return liveThrough(expected.configs); };
     const Traces first = live(file.name(), body);

@@ -46,13 +46,14 @@ int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
     Input input(data, size);
     const unsigned choice = input.byte();
     const std::u16string pattern = patternOf(input.rest());
-    bundlePattern = pattern.c_str();
+    setBundlePattern(pattern);
     Kinds readByIcu;
     if (kindsByIcu(pattern, readByIcu))
-        compare(fetchableKinds(bundlePattern), readByIcu);
+        compare(fetchableKinds(pattern.c_str()), readByIcu);
 
     const std::vector<uint64_t> slots = slotsOf(kindsToPass(pattern), choice);
-    ZlvEvent *event = ZlvVaAllocUEvent(ZLV_LEVEL_NONE, "bundle", "key", nullptr, nullptr);
+    ZlvEvent *event =
+        ZlvVaAllocUEvent(ZLV_LEVEL_NONE, "bundle", bundleKey().c_str(), nullptr, nullptr);
     writeAndBind(event, nullptr, false);
     withList(slots,
              [&](va_list list) { writeAndBind(event, list, slots.size() <= MOST_ARGUMENTS); });

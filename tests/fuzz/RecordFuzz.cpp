@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Feeds events to the three formatters: any properties, texts, identifiers, levels, bundles,
 // arguments and settings. Each record is compared with the same record put together by a model.
-//
-// An input is, in this order: bytes that choose (see Story), a level, a time, and texts that end
-// with a zero: pattern, identifier, separator, then names and values of properties in turn.
+#include <unicode/ucal.h>
+#include <unicode/uloc.h>
 #include <unicode/umsg.h>
+#include <unicode/unistr.h>
 
 #include "CxUStringBuff.h"
 #include "ZlvBasicFormatter.h"
@@ -19,6 +19,7 @@
 #include "support/Fuzz.h"
 #include "support/OneBundle.h"
 #include "support/RecordModel.h"
+#include "support/RecordStory.h"
 #include "util/CxOwned.h"
 
 using namespace zelvo_fuzz;
@@ -28,80 +29,18 @@ using zelvo::OwnedUStr;
 
 namespace {
 
-constexpr int64_t BEHIND_9999 = 253402300800000;
-constexpr size_t MOST_PROPERTIES = 8;
-
-constexpr int32_t levels[] = {-9999, 0, 1000, 2000, 3000, 4000, 5000, 6000, 7000, 9999};
-constexpr const char *dateFormats[] = {nullptr, "HH:mm", "'at' yyyy", ""};
-constexpr const char *locales[] = {nullptr, "de", "en_US", "tr"};
-constexpr const char *knownProperties[] = {
-    "threadId",        "correlationId", "client",      "zlv_prop_srcfile",     "zlv_prop_srcline",
-    "server",          "serverFormat",  "product",     "zlv_prop_srcfunction", "component",
-    "productInstance", "processId",     "organization"};
-
-/// An input, taken apart.
-struct Story {
-    explicit Story(Input input)
-        : choices(static_cast<uint32_t>(input.number(3))), level(levelOf(input)),
-          time(static_cast<int64_t>(input.number(6)) % BEHIND_9999),
-          pattern(patternOf(input.text())), messageId(input.text()), separator(input.text())
-    {
-        while (!input.isAtEnd() && properties.size() < MOST_PROPERTIES)
-            takeProperty(input);
-    }
-
-    bool chooses(int bit) const { return (choices >> bit & 1) != 0; }
-    const char *dateFormat() const { return dateFormats[choices >> 16 & 3]; }
-    const char *locale() const { return locales[choices >> 18 & 3]; }
-    unsigned arguments() const { return choices >> 20; }
-
-    bool isMessage() const { return chooses(0); }
-    bool hasBundle() const { return chooses(1); }
-    bool hasMessageId() const { return chooses(2); }
-    bool hasSeparator() const { return chooses(3); }
-
-    XmlSettings settings() const
-    {
-        return {.forceAsMessage = chooses(4),
-                .forceAsTrace = chooses(5),
-                .singleServer = chooses(6),
-                .singleProduct = chooses(7),
-                .singleComponent = chooses(8),
-                .singleProductId = chooses(9),
-                .isFirst = true};
-    }
-
-    uint32_t choices;
-    int32_t level;
-    int64_t time;
-    std::u16string pattern;
-    std::string messageId;
-    std::string separator;
-    std::vector<std::pair<std::string, std::string>> properties;
-
-private:
-    /// One of the usual levels, or any.
-    static int32_t levelOf(Input &input)
-    {
-        const uint8_t choice = input.byte();
-        return choice < std::size(levels) ? levels[choice] : static_cast<int32_t>(input.number(4));
-    }
-
-    /// A name that is one byte chooses one of those that mean something.
-    void takeProperty(Input &input)
-    {
-        std::string name = input.text();
-        if (name.size() == 1)
-            name = knownProperties[static_cast<uint8_t>(name[0]) % std::size(knownProperties)];
-        const std::string value = input.text();
-        for (auto &[known, former] : properties)
-            if (known == name) {
-                former = value;
-                return;
-            }
-        properties.emplace_back(name, value);
-    }
-};
+/// Changes the defaults of ICU where the story has others than the one before.
+void configureIcu(const Story &story)
+{
+    static const char *locale;
+    static const UChar *zone;
+    UErrorCode status = U_ZERO_ERROR;
+    if (std::exchange(locale, story.defaultLocale()) != story.defaultLocale())
+        uloc_setDefault(locale, &status);
+    if (std::exchange(zone, story.zone().name) != story.zone().name)
+        ucal_setDefaultTimeZone(zone, &status);
+    check(U_SUCCESS(status), "ICU takes the defaults");
+}
 
 /// The formatters.
 class World {
@@ -117,6 +56,7 @@ public:
 
     void configure(const Story &story) const
     {
+        configureIcu(story);
         const XmlSettings settings = story.settings();
         for (ZlvObject *formatter : {line, xml}) {
             ZlvSetObjProp(formatter, "locale", story.locale());
@@ -141,7 +81,7 @@ ZlvEvent *newEvent(const Story &story)
     const bool bundled = story.hasBundle();
     ZlvEvent *event =
         ZlvVaAllocUEvent(story.level, bundled ? BUNDLE.data() : nullptr,
-                         bundled ? KEY.data() : nullptr, story.pattern.c_str(), nullptr);
+                         bundled ? bundleKey().c_str() : nullptr, story.pattern.c_str(), nullptr);
     event->time = static_cast<double>(story.time);
     ZlvSetEventIsMessage(event, story.isMessage());
     if (story.hasMessageId())
@@ -217,11 +157,28 @@ WideText dateOf(ZlvObject *formatter, const Story &story)
 {
     const bool isPlain = formatter->formatter.dateTimeFormat == nullptr;
     return isPlain
-               ? plainDate(story.time)
+               ? plainDate(story.time, story.zone().minutes)
                : taken(ZlvBasicUFormatterFormatDate(formatter, static_cast<double>(story.time)));
 }
 
 /* What is compared. */
+
+void print(const char *title, const WideText &text)
+{
+    std::string bytes;
+    icu::UnicodeString(text.c_str()).toUTF8String(bytes);
+    std::fprintf(stderr, "%s: %s\n", title, bytes.c_str());
+}
+
+void checkRecord(UChar *record, const WideText &expected, const char *claim)
+{
+    const WideText found = taken(record);
+    if (found == expected)
+        return;
+    print("found", found);
+    print("expected", expected);
+    refute(claim);
+}
 
 void checkXml(const World &world, const Story &story, ZlvEvent *event, const EventStory &told,
               va_list list)
@@ -229,13 +186,11 @@ void checkXml(const World &world, const Story &story, ZlvEvent *event, const Eve
     const WideText date = dateOf(world.xml, story);
     XmlSettings settings = story.settings();
     ZlvPDXMLFormatterFGetHeader(world.xml);
-    check(taken(ZlvPDXMLUFormatterFFormat(world.xml, event, list)) ==
-              xmlRecord(told, date, settings),
-          "the first XML record of a file has the single items before it");
+    checkRecord(ZlvPDXMLUFormatterFFormat(world.xml, event, list), xmlRecord(told, date, settings),
+                "the first XML record of a file has the single items before it");
     settings.isFirst = false;
-    check(taken(ZlvPDXMLUFormatterFFormat(world.xml, event, list)) ==
-              xmlRecord(told, date, settings),
-          "further XML records do not have them");
+    checkRecord(ZlvPDXMLUFormatterFFormat(world.xml, event, list), xmlRecord(told, date, settings),
+                "further XML records do not have them");
 }
 
 void checkLayouts(const World &world, const Story &story, ZlvEvent *event,
@@ -243,14 +198,13 @@ void checkLayouts(const World &world, const Story &story, ZlvEvent *event,
 {
     // The trace formatter takes no settings; before the others it finds the event without locale.
     const EventStory plain = eventStory(story, slots, nullptr, list);
-    check(taken(ZlvVyxTraceUFormatterFFormat(world.trace, event, list)) ==
-              traceRecord(plain, plainDate(story.time)),
-          "a trace line has its fields");
+    checkRecord(ZlvVyxTraceUFormatterFFormat(world.trace, event, list),
+                traceRecord(plain, plainDate(story.time, story.zone().minutes)),
+                "a trace line has its fields");
     const EventStory local = eventStory(story, slots, story.locale(), list);
-    check(taken(ZlvBasicUFormatterFFormat(world.line, event, list)) ==
-              lineRecord(local, dateOf(world.line, story),
-                         story.hasSeparator() ? story.separator : " "),
-          "a line has its fields");
+    const std::string separator = story.hasSeparator() ? story.separator : " ";
+    checkRecord(ZlvBasicUFormatterFFormat(world.line, event, list),
+                lineRecord(local, dateOf(world.line, story), separator), "a line has its fields");
     checkXml(world, story, event, local, list);
 }
 
@@ -260,7 +214,7 @@ int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
 {
     static const World world;
     const Story story(Input(data, size));
-    bundlePattern = story.pattern.c_str();
+    setBundlePattern(story.pattern);
     const std::vector<uint64_t> slots = slotsOf(kindsToPass(story.pattern), story.arguments());
     if (slots.size() > MOST_ARGUMENTS)
         return 0;

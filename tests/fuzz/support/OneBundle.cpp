@@ -1,11 +1,27 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "support/OneBundle.h"
 
-#include <string>
+#include <functional>
 
 #include <unicode/ures.h>
 
-const UChar *zelvo_fuzz::bundlePattern = u"";
+namespace {
+
+std::u16string currentPattern;
+std::string currentKey;
+
+} // namespace
+
+void zelvo_fuzz::setBundlePattern(const std::u16string &pattern)
+{
+    currentPattern = pattern;
+    currentKey = "key" + std::to_string(std::hash<std::u16string>{}(pattern));
+}
+
+const std::string &zelvo_fuzz::bundleKey()
+{
+    return currentKey;
+}
 
 // The names are the linker's: these answer for ICU wherever the library asks for a bundle.
 // NOLINTBEGIN(bugprone-reserved-identifier, cert-dcl37-c, cert-dcl51-cpp)
@@ -26,8 +42,8 @@ const UChar *U_ICU_ENTRY_POINT_RENAME(__wrap_ures_getStringByKey)(const UResourc
                                                                   const char *, int32_t *length,
                                                                   UErrorCode *)
 {
-    *length = static_cast<int32_t>(std::char_traits<UChar>::length(zelvo_fuzz::bundlePattern));
-    return zelvo_fuzz::bundlePattern;
+    *length = static_cast<int32_t>(currentPattern.size());
+    return currentPattern.c_str();
 }
 void U_ICU_ENTRY_POINT_RENAME(__wrap_ures_close)(UResourceBundle *) {}
 }

@@ -1,13 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 // A world with one resource bundle, which answers to every name and has one pattern under every
-// key.
+// key. Another pattern gets another key, since what is found under a key may be remembered.
 #pragma once
 
-#include <unicode/umachine.h>
+#include <string>
 
 namespace zelvo_fuzz {
 
-/// The pattern; the caller keeps it alive.
-extern const UChar *bundlePattern;
+void setBundlePattern(const std::u16string &pattern);
+
+/// The key that belongs to the pattern.
+const std::string &bundleKey();
 
 } // namespace zelvo_fuzz

@@ -9,6 +9,7 @@
 #include "support/Fuzz.h"
 #include "support/Identifiers.h"
 #include "support/Numbers.h"
+#include "support/OneBundle.h"
 
 namespace zelvo_fuzz {
 namespace {
@@ -168,7 +169,7 @@ void addMessageParts(Layout &out, const EventStory &event)
         out.add(" <TranslationInfo Resource Bundle=\"")
             .add(BUNDLE)
             .add("\" MsgKey=\"")
-            .add(KEY)
+            .add(bundleKey())
             .add("\">")
             .add(*event.parameters)
             .add("</TranslationInfo>\n");
@@ -196,15 +197,18 @@ WideText wide(std::string_view bytes)
     return text;
 }
 
-WideText plainDate(int64_t time)
+WideText plainDate(int64_t time, int32_t minutesEast)
 {
-    const time_t seconds = time / 1000;
+    const time_t seconds = time / 1000 + int64_t{minutesEast} * 60;
     tm parts{};
     gmtime_r(&seconds, &parts);
     char text[64];
     const size_t length = std::strftime(text, sizeof text, "%Y-%m-%d %H:%M:%S", &parts);
-    std::snprintf(text + length, sizeof text - length, ".%03d+00:00",
-                  static_cast<int>(time % 1000));
+    // The hours of a zone decide on the sign that stands before them, the minutes keep theirs.
+    const int32_t hours = minutesEast / 60;
+    std::snprintf(text + length, sizeof text - length, ".%03d%c%02d:%02d",
+                  static_cast<int>(time % 1000), hours < 0 ? '-' : '+', std::abs(hours),
+                  minutesEast % 60);
     return wide(text);
 }
 

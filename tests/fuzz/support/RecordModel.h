@@ -36,12 +36,11 @@ WideText lineRecord(const EventStory &event, const WideText &date, const std::st
 WideText xmlRecord(const EventStory &event, const WideText &date, const XmlSettings &settings);
 WideText traceRecord(const EventStory &event, const WideText &date);
 
-/// The bundle and the key of events that have one.
+/// The bundle of events that have one; its key is that of OneBundle.h.
 constexpr std::string_view BUNDLE = "shop";
-constexpr std::string_view KEY = "opened";
 
-/// The default form of a date between 1970 and 9999, in UTC.
-WideText plainDate(int64_t time);
+/// The default form of a date between 1970 and 9999, in a zone that many minutes east of UTC.
+WideText plainDate(int64_t time, int32_t minutesEast);
 
 /// Bytes in the default code page, which the targets set to UTF-8.
 WideText wide(std::string_view bytes);
