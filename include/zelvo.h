@@ -114,6 +114,7 @@
 #include "ZlvLevel.h"
 #include "ZlvLevelFilter.h"
 #include "ZlvListenerGroup.h"
+#include "ZlvLogMacros.h"
 #include "ZlvLogManager.h"
 #include "ZlvLoggable.h"
 #include "ZlvLogger.h"
