@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: Apache-2.0
+// A control: the file tells no reason.
+#include "zelvo_logger.hpp"
+
+void log(const zelvo::Logger &logger);
+
+void log(const zelvo::Logger &logger)
+{
+#ifdef FAULT_REMOVED
+    logger.debugMin(u"{0}", u"text");
+#else
+    logger.debugMin(u"{0}", nullptr);
+#endif
+}

@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: Apache-2.0
+// expect: zelvo: header is zelvo::String header(zelvo::Self) noexcept
+#include "zelvo_class.hpp"
+
+class Own {
+public:
+#ifdef FAULT_REMOVED
+    zelvo::String header(zelvo::Self) noexcept
+    {
+        return {};
+    }
+#else
+    zelvo::UString header(zelvo::Self) noexcept
+    {
+        return {};
+    }
+#endif
+    zelvo::UString format(zelvo::Self, zelvo::Event) noexcept
+    {
+        return {};
+    }
+};
+
+void add();
+
+void add()
+{
+    zelvo::addFormatterClass<Own>("own");
+}
