@@ -73,9 +73,12 @@
  *     one list serves several handlers, and the caller may use it again. Where a va_list is a
  *     pointer, a null one stands for zeros.
  *
- * 15. Forks. A fork waits until no other thread is inside the library, so the child may log at
- *     once. Open log files are shared by both processes from then on, and only the class
- *     zlv_multiproc_filehandler keeps their records and rollovers in order.
+ * 15. Forks. A fork waits until no other thread is inside a call that takes the mutex, so the child
+ *     may log at once. When a class function forks, both processes go on with its event. Open log
+ *     files are shared by both processes from then on, and only the class
+ *     zlv_multiproc_filehandler keeps their records and rollovers in order. A thread that calls ICU
+ *     without the mutex, by itself or through the portability layer, may leave ICU's own locks held
+ *     in the child for ever: such a child must not log.
  *
  * 16. Signals. A signal handler must not log, nor call anything else here: the mutex may be held by
  *     the code that it interrupts.

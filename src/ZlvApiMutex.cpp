@@ -13,7 +13,8 @@ ZlvBool ZLV_TK_API_MUTEX_EXISTS = 0;
 
 namespace {
 
-// Keeps two first callers from both creating the API mutex.
+// Keeps two first callers from both creating the API mutex, and close from destroying it while
+// another thread forks.
 pthread_mutex_t creation = PTHREAD_MUTEX_INITIALIZER;
 
 std::atomic_ref<ZlvBool> exists()
@@ -25,19 +26,34 @@ std::atomic_ref<ZlvBool> exists()
 thread_local bool held = false;
 
 // A fork waits until no other thread is inside the library. The child, whose only thread is the one
-// that forked, thus finds the mutex free and everything under it whole.
+// that forked, thus finds the mutex free and everything under it whole. A class function that forks
+// waits for nobody: who could be inside is the forking thread itself, and others that fork wait for
+// it with the creation mutex in their hands.
 void beforeFork()
 {
+    if (held)
+        return;
     pthread_mutex_lock(&creation);
-    if (!held && exists().load(std::memory_order_relaxed) == 1)
+    if (exists().load(std::memory_order_relaxed) == 1)
         CxMutexLock(ZLV_TK_API_MUTEX);
 }
 
-void afterFork()
+void afterForkInParent()
 {
-    if (!held && exists().load(std::memory_order_relaxed) == 1)
+    if (held)
+        return;
+    if (exists().load(std::memory_order_relaxed) == 1)
         CxMutexUnlock(ZLV_TK_API_MUTEX);
     pthread_mutex_unlock(&creation);
+}
+
+/// Those who held the creation mutex while a class function forked are not there in the child.
+void afterForkInChild()
+{
+    if (held)
+        pthread_mutex_init(&creation, nullptr);
+    else
+        afterForkInParent();
 }
 
 /// The caller holds the creation mutex.
@@ -45,7 +61,7 @@ void watchForks()
 {
     static bool watching = false;
     if (!watching)
-        watching = pthread_atfork(beforeFork, afterFork, afterFork) == 0;
+        watching = pthread_atfork(beforeFork, afterForkInParent, afterForkInChild) == 0;
 }
 
 CxStatus createOnce()
@@ -93,8 +109,10 @@ void zlvAPIMutexUnlock(void)
 
 void zelvo::destroyApiMutex()
 {
-    if (exists().load(std::memory_order_relaxed) == 0)
-        return;
-    succeeded(CxMutexDestroy(&ZLV_TK_API_MUTEX));
-    exists().store(0, std::memory_order_relaxed);
+    pthread_mutex_lock(&creation);
+    if (exists().load(std::memory_order_relaxed) == 1) {
+        succeeded(CxMutexDestroy(&ZLV_TK_API_MUTEX));
+        exists().store(0, std::memory_order_relaxed);
+    }
+    pthread_mutex_unlock(&creation);
 }
