@@ -130,6 +130,30 @@ TEST_F(HostileProperties, HaveFilesRemovedAndRenamed)
     EXPECT_EQ(read("victim1"), "v\n");
 }
 
+TEST_F(HostileProperties, HaveARolloverLookAtEveryNumber)
+{
+    write("app.log", "live\n");
+    write("app7.log", "old\n");
+    openWith("log.fileName = app.log\nlog.maxFileBytes = 1\nlog.maxFiles = 9\n");
+    log(u"a");
+    EXPECT_EQ(rolled(1), "live\n");
+    EXPECT_EQ(rolled(8), "old\n");
+}
+
+TEST_F(HostileProperties, HaveARecordTakeEveryWayThroughListenersThatListOneAnother)
+{
+    open("app.className = zlv_basiclogger\n"
+         "app.listenerNames = screen.1 screen.2 screen.3\n"
+         "screen.className = zlv_consolehandler\n"
+         "screen.listenerNames = screen.1 screen.2 screen.3\n");
+    app_ = logger("app", nullptr);
+    const std::string printed = console([&] { log(u"record"); });
+    size_t records = 0;
+    for (size_t at = 0; (at = printed.find("record", at)) != std::string::npos; ++at)
+        ++records;
+    EXPECT_EQ(records, 3U + 3 * 2 + 3 * 2 * 1);
+}
+
 TEST_F(HostileProperties, OfAClassThatNobodyRegisteredMakeNothing)
 {
     open("x.className = elsewhere\n");

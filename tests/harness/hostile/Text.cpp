@@ -51,6 +51,14 @@ TEST_F(HostileText, BracesInAnArgumentAreNoPattern)
         holds(recordOf("zlv_basicformatter", u"{0} {1,number} '"), "user {0} {1,number} '"));
 }
 
+TEST_F(HostileText, APatternDecidesWhatAnArgumentIsReadAs)
+{
+    handler("fileName", "app.log");
+    EXPECT_TRUE(ok(ZlvLogUText(app_, u"{0,number,integer}", u"text")));
+    const std::string record = read("app.log"); // half an address
+    EXPECT_EQ(record.find_first_not_of("-0123456789,\n"), std::string::npos) << record;
+}
+
 TEST_F(HostileText, BracesInTheIdentityOfALoggerAreNoPattern)
 {
     ZlvObject *identified = logger("identified", "zlv_pdlogger");
