@@ -24,7 +24,7 @@ CX_BEGIN_DECLS
 static inline int32_t ZlvIsLoggableInline(const ZlvObject *logger, ZlvLevel level)
 {
     ZlvLevel threshold;
-    if (logger == NULL || !__atomic_load_n(&logger->enabled, __ATOMIC_RELAXED))
+    if (!logger || !__atomic_load_n(&logger->enabled, __ATOMIC_RELAXED))
         return 0;
     if (level == ZLV_LEVEL_NONE)
         return 1;
