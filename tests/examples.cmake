@@ -9,7 +9,8 @@ function(zelvo_script_test name script)
     set_tests_properties(${name} PROPERTIES ENVIRONMENT "LC_ALL=C.UTF-8;TZ=UTC")
 endfunction()
 
-foreach(example IN ITEMS quickstart own_handler reconfigure)
+foreach(example IN ITEMS
+        quickstart own_handler reconfigure log_macros cpp_quickstart cpp_own_classes cpp_testing)
     zelvo_script_test(${example}_runs check_output
         0 ${examples}/${example}.output $<TARGET_FILE:${example}>)
 endforeach()
