@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // The handler that keeps events for the tests of applications.
-#include <algorithm>
+#include <cstdio>
+#include <fstream>
 #include <set>
 #include <thread>
+
+#include <unistd.h>
 
 #include "CppTest.h"
 
@@ -96,6 +99,21 @@ TEST_F(CppMemoryHandler, IsKnownToConfigurationsOnceRegistered)
     app_.setProperty("listenerNames", "from.config");
     app_.text(u"configured");
     EXPECT_EQ(zelvo::MemoryHandler("from.config").last()->text, u"configured");
+}
+
+TEST(CppMemoryHandlerLife, MayServeWhatOpeningMakes)
+{
+    const std::string path = testing::TempDir() + "zelvo_memory_" + std::to_string(getpid());
+    std::ofstream(path) << "zelvo.errorLogger.listenerNames = early\n"
+                        << "early.className = zelvo_memoryhandler\n";
+    zelvo::MemoryHandler::addClass();
+    {
+        const zelvo::Toolkit toolkit(path.c_str());
+        ASSERT_TRUE(toolkit);
+        zelvo::Logger(ZLV_ERROR_LOGGER_NAME).text(u"from the start");
+        EXPECT_EQ(zelvo::MemoryHandler("early").last()->text, u"from the start");
+    }
+    std::remove(path.c_str());
 }
 
 TEST_F(CppMemoryHandler, ThreadsLogWhileOthersRead)

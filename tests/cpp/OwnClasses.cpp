@@ -76,6 +76,16 @@ private:
     int32_t number_ = 0;
 };
 
+/// A logger whose messages are German.
+class Germanising {
+public:
+    void log(zelvo::Self self, zelvo::Event event) noexcept
+    {
+        event.setLocale("de");
+        self.passOn(event);
+    }
+};
+
 /// A formatter that puts a text between brackets.
 class Brackets {
 public:
@@ -121,8 +131,18 @@ protected:
         zelvo::addHandlerClass<Gatherer>("gatherer");
         zelvo::addFilterClass<Alternator>("alternator");
         zelvo::addLoggerClass<Numbering>("numbering");
+        zelvo::addLoggerClass<Germanising>("germanising");
         zelvo::addFormatterClass<Brackets>("brackets");
         zelvo::addHandlerClass<Asking>("asking");
+    }
+
+    /// Makes an object what it is when there was no memory for its state.
+    template <class T>
+    static void loseState(const zelvo::Object &object)
+    {
+        object.get()->objClass->fFreeVars(object.get()->vars);
+        object.get()->vars = nullptr;
+        EXPECT_FALSE(zelvo::withState<T>(object, [](T &) { FAIL(); }));
     }
 
     static std::vector<std::u16string> textsOf(const zelvo::Handler &handler)
@@ -240,6 +260,55 @@ TEST_F(CppOwnClass, TheStateOfAnotherClassIsOutOfReach)
     EXPECT_FALSE(zelvo::withState<Asking>(handler, [](Asking &) { FAIL(); }));
     EXPECT_FALSE(zelvo::withState<Asking>(app_, [](Asking &) { FAIL(); }));
     EXPECT_FALSE(zelvo::withState<Asking>(zelvo::Object(), [](Asking &) { FAIL(); }));
+}
+
+TEST_F(CppOwnClass, WithoutAStateAnObjectIsTheDefaultOfItsKind)
+{
+    const zelvo::Logger logger("numbered", "numbering");
+    const zelvo::Object filter("every.second", "alternator");
+    const zelvo::Handler handler("first", "gatherer");
+    const zelvo::Object formatter("brackets", "brackets");
+    loseState<Numbering>(logger);
+    loseState<Alternator>(filter);
+    loseState<Gatherer>(handler);
+    loseState<Brackets>(formatter);
+    logger.addListener(filter);
+    filter.addListener(memory_);
+    filter.addListener(handler);
+    filter.setProperty("level", "INFO");
+
+    handler.setFormatter(formatter);
+    handler.setProperty("limit", 7);
+    logger.text(u"through");
+    logger.debugMin(u"below the level of the filter");
+    EXPECT_EQ(memory_.count(), 1U);
+    EXPECT_EQ(property("number"), "(none)");
+    EXPECT_FALSE(zelvo::String(ZlvHandlerGetFmtHeader(handler.get())));
+    EXPECT_FALSE(zelvo::String(ZlvHandlerGetFmtTrailer(handler.get())));
+}
+
+TEST_F(CppOwnClass, WithoutItsStateAFormatterIsTheBasicOne)
+{
+    const zelvo::Object formatter("brackets", "brackets");
+    const zelvo::Handler asking("asking", "asking");
+    loseState<Brackets>(formatter);
+    formatter.setProperty("dateTimeFormat", "'date'");
+    asking.setFormatter(formatter);
+    app_.addListener(asking);
+    app_.text(u"x");
+    std::string all;
+    zelvo::withState<Asking>(asking, [&all](const Asking &state) { all = state.all(); });
+    EXPECT_EQ(all, "date x\n");
+}
+
+TEST_F(CppOwnClass, AnEventCarriesItsLocaleOn)
+{
+    const zelvo::Logger logger("german", "germanising");
+    logger.addListener(memory_);
+    logger.text(u"{0,number}", 1234.5);
+    EXPECT_EQ(text(), u"1.234,5");
+    app_.text(u"{0,number}", 1234.5);
+    EXPECT_EQ(text(), u"1,234.5");
 }
 
 TEST_F(CppOwnClass, WithoutAnEventTheEntriesDoNothing)
