@@ -5,6 +5,7 @@
 
 #include "support/Floor.h"
 #include "support/Records.h"
+#include "zelvo.hpp"
 
 using namespace zelvo_bench;
 
@@ -20,6 +21,10 @@ int main(int argc, char **argv)
         measure(name, tree.output(), [&tree] { tree.log(); });
         measure("floor of " + name, {{file}, record.size()}, AppendFloor(file, record));
     }
+    const zelvo::Logger logger(zelvo::Object::share(trees.front().logger()));
+    measure("line in C++", trees.front().output(), [&logger] {
+        logger.debugMin({ASKED, nullptr, nullptr, 0}, CLIENT, WISH, SERIAL);
+    });
     const std::string record = trees.front().sample(), file = place.file("write");
     measure("write", {{file}, record.size()}, WriteFloor(file, record));
     return runBenchmarks(argc, argv);

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// What a call costs whose level is below the logger's threshold: the call itself, and the test that
-// the header offers in its place. The floor is a call of an empty function in a shared object.
+// What a call costs whose level is below the logger's threshold: the call itself, the test that the
+// header offers in its place, and the call of the C++ layer. The floor is a call of an empty
+// function in a shared object.
 #include "empty_call.h"
 #include "support/Records.h"
+#include "zelvo.hpp"
 
 using namespace zelvo_bench;
 
@@ -30,6 +32,9 @@ int main(int argc, char **argv)
         if (ZlvIsLoggableInline(logger, ZLV_LEVEL_INFO))
             log(logger);
     });
+    const zelvo::Logger inCpp(zelvo::Object::share(logger));
+    measureCheap("refused in C++",
+                 [&inCpp] { inCpp.info(ZELVO_BENCH_BUNDLE, "asked", CLIENT, WISH, SERIAL); });
     const int result = runBenchmarks(argc, argv);
     return sizeOf(tree.files()[0]) == logged ? result : 1;
 }

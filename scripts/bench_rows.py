@@ -31,6 +31,7 @@ SECTIONS = {
     "Refused calls, against a call of an empty function": [
         Row("a call", "refused/refused", "refused/empty call", 3.0, 2.0),
         Row("the test in the header", "refused/refused inline", "refused/empty call", 1.5, 1.0),
+        Row("a call in C++", "refused/refused in C++", "refused/empty call"),
     ],
     "Records, against their system calls": [
         against_floor("line", "line", 1.6, 1.25),
@@ -40,6 +41,7 @@ SECTIONS = {
         against_floor("XML record", "xml", 3.0, 2.0),
         against_floor("trace line", "trace", 2.0, 1.5),
         Row("line to a shared file", "shared/shared", "shared/floor of shared", 1.5, 1.2),
+        Row("C++ line record / C line record", "records/line in C++", "records/line"),
         Row("for comparison: the write alone", "records/write", "records/floor of line"),
     ],
     "Peers": [

@@ -9,8 +9,6 @@ namespace zelvo_bench {
 
 namespace {
 
-constexpr const UChar *ASKED = u"Client {0} asked for {1} ({2,number,integer})";
-
 void logText(ZlvObject *logger)
 {
     ZlvLogDebugMin(logger, nullptr, nullptr, 0, ASKED, CLIENT, WISH, SERIAL);

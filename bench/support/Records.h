@@ -40,6 +40,7 @@ private:
 };
 
 /// What all records tell.
+constexpr const UChar *ASKED = u"Client {0} asked for {1} ({2,number,integer})";
 constexpr const UChar *CLIENT = u"10.23.42.17";
 constexpr const UChar *WISH = u"/articles/index.html";
 constexpr int32_t SERIAL = 4711;
