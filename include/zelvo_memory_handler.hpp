@@ -6,6 +6,8 @@
 #ifndef ZELVO_MEMORY_HANDLER_HPP
 #define ZELVO_MEMORY_HANDLER_HPP
 
+#include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
