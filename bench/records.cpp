@@ -25,6 +25,8 @@ int main(int argc, char **argv)
     measure("line in C++", trees.front().output(), [&logger] {
         logger.debugMin({ASKED, nullptr, nullptr, 0}, CLIENT, WISH, SERIAL);
     });
+    const std::string line = trees.front().sample(), calls = place.file("own calls");
+    measure("own calls", {{calls}, line.size()}, OwnCallsFloor(calls, line));
     const std::string record = trees.front().sample(), file = place.file("write");
     measure("write", {{file}, record.size()}, WriteFloor(file, record));
     return runBenchmarks(argc, argv);

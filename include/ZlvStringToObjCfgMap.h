@@ -4,7 +4,8 @@
  * ZlvStringToObjCfgMap.h - ordered maps from name to configuration.
  *
  * A map keeps its entries in the order in which their keys were first put. Keys are compared
- * exactly, upper and lower case distinct. Lookup takes time in proportion to the number of entries.
+ * exactly, upper and lower case distinct. Lookup in a large map takes hardly longer than in a small
+ * one.
  *
  * Walk: take an iterator from ZlvStringToObjCfgMapIterator(); while
  * ZlvStringToObjCfgMapIterHasNext(), read with ZlvStringToObjCfgMapIterGetKey() and
@@ -32,6 +33,7 @@ typedef StringToObjCfgMapNode *StringToObjCfgMapIterator;
 struct StringToObjCfgMap {
     StringToObjCfgMapNode *first; /**< the oldest entry; null when empty */
     StringToObjCfgMapNode *last;  /**< the newest entry; null when empty */
+    void *index; /**< finds the keys of a large map; null as long as there is none */
 };
 
 /** Node of a map. */

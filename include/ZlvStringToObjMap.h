@@ -4,7 +4,8 @@
  * ZlvStringToObjMap.h - ordered maps from name to object.
  *
  * A map keeps its entries in the order in which their keys were first put. Keys are compared
- * exactly, upper and lower case distinct. Lookup takes time in proportion to the number of entries.
+ * exactly, upper and lower case distinct. Lookup in a large map takes hardly longer than in a small
+ * one.
  *
  * Walk: take an iterator from ZlvStringToObjMapIterator(); while ZlvStringToObjMapIterHasNext(),
  * read with ZlvStringToObjMapIterGetKey() and ZlvStringToObjMapIterGetVal() and move on with
@@ -31,6 +32,7 @@ typedef StringToObjMapNode *StringToObjMapIterator;
 struct StringToObjMap {
     StringToObjMapNode *first; /**< the oldest entry; null when empty */
     StringToObjMapNode *last;  /**< the newest entry; null when empty */
+    void *index;               /**< finds the keys of a large map; null as long as there is none */
 };
 
 /** Node of a map. */

@@ -4,7 +4,8 @@
  * ZlvStringToStringMap.h - ordered maps from string to string.
  *
  * A map keeps its entries in the order in which their keys were first put. Keys are compared
- * exactly, upper and lower case distinct. Lookup takes time in proportion to the number of entries.
+ * exactly, upper and lower case distinct. Lookup in a large map takes hardly longer than in a small
+ * one.
  *
  * Walk: take an iterator from ZlvStringToStringMapIterator(); while
  * ZlvStringToStringMapIterHasNext(), read with ZlvStringToStringMapIterGetKey() and
@@ -29,6 +30,7 @@ typedef StringToStringMapNode *StringToStringMapIterator;
 struct StringToStringMap {
     StringToStringMapNode *first; /**< the oldest entry; null when empty */
     StringToStringMapNode *last;  /**< the newest entry; null when empty */
+    void *index; /**< finds the keys of a large map; null as long as there is none */
 };
 
 /** Node of a map. */

@@ -42,6 +42,7 @@ SECTIONS = {
         against_floor("trace line", "trace", 2.0, 1.5),
         Row("line to a shared file", "shared/shared", "shared/floor of shared", 1.5, 1.2),
         Row("C++ line record / C line record", "records/line in C++", "records/line"),
+        Row("for comparison: line, against its own calls", "records/line", "records/own calls"),
         Row("for comparison: the write alone", "records/write", "records/floor of line"),
     ],
     "Peers": [

@@ -12,12 +12,12 @@
 
 #include <cerrno>
 #include <fcntl.h>
-#include <sys/stat.h>
 
 #include "CxString.h"
 #include "ZlvFileHandlerIntl.h"
 #include "ZlvIntl.h"
 #include "util/CxBytes.h"
+#include "util/CxFileFacts.h"
 #include "util/CxFileIntl.h"
 #include "util/CxStatusIntl.h"
 
@@ -25,23 +25,23 @@ using namespace zelvo;
 
 namespace {
 
-FileIdentity identityOf(const struct stat &facts)
+FileIdentity identityOf(const FileFacts &facts)
 {
-    return {facts.st_dev, facts.st_ino};
+    return {facts.device, facts.inode};
 }
 
-bool namesRegularFile(const char *name, struct stat &facts)
+bool namesRegularFile(const char *name, FileFacts &facts)
 {
     LocalName local;
-    return isOk(localName(name, local)) && stat(local.text, &facts) == 0 && S_ISREG(facts.st_mode);
+    return isOk(localName(name, local)) && readFacts(local.text, facts) && facts.isRegular;
 }
 
 /// Takes the size from the test of the name, if that is the open file and below its limit.
-bool assumeSize(FileHandlerState &state, const struct stat &named)
+bool assumeSize(FileHandlerState &state, const FileFacts &named)
 {
     if (measureEachTime || identityOf(named) != state.opened)
         return false;
-    state.vars.currentSize = static_cast<uint64_t>(named.st_size);
+    state.vars.currentSize = named.size;
     state.sizeAssumed = !isRolloverDue(state.vars);
     return state.sizeAssumed;
 }
@@ -54,7 +54,7 @@ enum class LiveFile { READY, GONE, UNREADABLE, FULL };
 LiveFile inspect(FileHandlerState &state, Next next)
 {
     state.sizeAssumed = false;
-    struct stat named;
+    FileFacts named;
     if (!namesRegularFile(state.vars.fullName, named))
         return LiveFile::GONE;
     if (next == Next::A_WRITE && assumeSize(state, named))
@@ -82,8 +82,8 @@ void writeFrame(ZlvObject *handler, char *(*make)(ZlvObject *))
 CxStatus openLive(FileHandlerState &state)
 {
     const CxStatus status = openLogFile(state.vars, state.vars.appending != 0 ? O_APPEND : O_TRUNC);
-    struct stat facts;
-    const bool isKnown = isOk(status) && !measureEachTime && fstat(state.vars.file, &facts) == 0;
+    FileFacts facts;
+    const bool isKnown = isOk(status) && !measureEachTime && readFacts(state.vars.file, facts);
     state.opened = isKnown ? identityOf(facts) : FileIdentity{};
     state.sizeAssumed = false;
     return status;

@@ -5,6 +5,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "util/CxFileFacts.h"
 #include "util/CxFileIntl.h"
 #include "util/CxStatusIntl.h"
 
@@ -86,10 +87,10 @@ CxStatus CxFileGetSize(CxFile *file, uint64_t *size)
 {
     if (file == nullptr || size == nullptr)
         return missingArgument;
-    struct stat facts;
-    if (fstat(*file, &facts) == -1)
+    FileFacts facts;
+    if (!readFacts(*file, facts))
         return lastError();
-    *size = static_cast<uint64_t>(facts.st_size);
+    *size = facts.size;
     return success;
 }
 

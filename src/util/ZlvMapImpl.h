@@ -2,6 +2,7 @@
 // Maps from an exact string key to a value, iterated in the order in which the keys were first put.
 #pragma once
 
+#include "ZlvKeyIndex.h"
 #include "ZlvLinksImpl.h"
 
 namespace zelvo {
@@ -16,10 +17,9 @@ struct MapImpl {
 
     static Node *getNode(const Map *map, const char *key)
     {
-        Node *node = firstNode(map);
-        while (node != nullptr && !sameText(node->key, key))
-            node = node->next;
-        return node;
+        if (map == nullptr || key == nullptr)
+            return nullptr;
+        return map->index != nullptr ? indexOf(map)->find(key) : walkTo(map, key);
     }
 
     static bool put(Map *map, const char *key, Given value)
@@ -64,6 +64,8 @@ struct MapImpl {
         if (map == nullptr || node == nullptr || node->map != map)
             return;
         Value value = node->value;
+        if (map->index != nullptr && node->key != nullptr)
+            indexOf(map)->remove(node);
         unlinkNode(map, node);
         RkoMemoryFree(node->key);
         node->key = nullptr;
@@ -78,10 +80,36 @@ struct MapImpl {
             return;
         while (map->first != nullptr)
             removeNode(map, map->first);
+        RkoMemoryFree(map->index);
         RkoMemoryFree(map);
     }
 
 private:
+    using Index = KeyIndex<Node>;
+
+    static Index *indexOf(const Map *map) { return static_cast<Index *>(map->index); }
+
+    /// Walks, and makes an index after a long way. It does not change what the map holds.
+    static Node *walkTo(const Map *map, const char *key)
+    {
+        size_t steps = 0;
+        Node *node = map->first;
+        for (; node != nullptr && !sameText(node->key, key); ++steps)
+            node = node->next;
+        if (steps > Index::WORTHWHILE)
+            const_cast<Map *>(map)->index = Index::make(map->first);
+        return node;
+    }
+
+    /// An index without room is given up; the next long walk makes a larger one.
+    static void addToIndex(Map *map, Node *node)
+    {
+        if (map->index == nullptr || node->key == nullptr || indexOf(map)->add(node))
+            return;
+        RkoMemoryFree(map->index);
+        map->index = nullptr;
+    }
+
     /// A key or value that could not be copied is linked as null.
     static bool append(Map *map, const char *key, Given value)
     {
@@ -92,6 +120,7 @@ private:
         node->value = T::takeIn(value);
         node->map = map;
         linkLast(map, node);
+        addToIndex(map, node);
         return true;
     }
 

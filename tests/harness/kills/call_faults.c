@@ -53,14 +53,10 @@ static int fail(int code)
         raise(SIGKILL);                                                                            \
     return result
 
-int stat(const char *path, struct stat *facts)
+int statx(int directory, const char *path, int flags, unsigned wanted, struct statx *facts)
 {
-    MAKE(int, CALL_STAT, fail(EIO), syscall(SYS_newfstatat, AT_FDCWD, path, facts, 0));
-}
-
-int fstat(int descriptor, struct stat *facts)
-{
-    MAKE(int, CALL_FSTAT, fail(EIO), syscall(SYS_newfstatat, descriptor, "", facts, AT_EMPTY_PATH));
+    MAKE(int, path[0] != '\0' ? CALL_STAT : CALL_FSTAT, fail(EIO),
+         syscall(SYS_statx, directory, path, flags, wanted, facts));
 }
 
 int open(const char *path, int flags, ...)
