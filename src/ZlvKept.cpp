@@ -9,6 +9,7 @@ namespace {
 
 constinit DefaultLocale defaultLocale;
 constinit DefaultZone defaultZone;
+constinit DefaultConverter defaultConverter;
 
 } // namespace
 
@@ -20,6 +21,11 @@ uint64_t defaultLocaleNumber()
 uint64_t defaultZoneNumber()
 {
     return defaultZone.number();
+}
+
+uint64_t defaultConverterNumber()
+{
+    return defaultConverter.number();
 }
 
 void dropKept()

@@ -14,6 +14,7 @@ namespace zelvo {
 /// The numbers of ICU's present defaults; what was kept under other numbers does not hold.
 uint64_t defaultLocaleNumber();
 uint64_t defaultZoneNumber();
+uint64_t defaultConverterNumber();
 
 /// Lets go of all that is kept. Runs at the end of close.
 void dropKept();

@@ -10,11 +10,24 @@
 namespace zelvo {
 namespace {
 
-/// A form that is kept, with its pattern and the numbers of the defaults it was opened under.
-struct KeptDate {
-    char *pattern;
+/// The numbers of the defaults that a form is opened under; the converter reads its pattern.
+struct Defaults {
     uint64_t locale;
     uint64_t zone;
+    uint64_t converter;
+
+    static Defaults present()
+    {
+        return {defaultLocaleNumber(), defaultZoneNumber(), defaultConverterNumber()};
+    }
+
+    bool operator==(const Defaults &) const = default;
+};
+
+/// A form that is kept.
+struct KeptDate {
+    char *pattern;
+    Defaults defaults;
     DateFormat format;
     SecondText second;
 };
@@ -44,7 +57,7 @@ KeptDate &placeFor(const char *pattern)
 }
 
 /// Opens a form in a place; false when it cannot be kept.
-bool fill(KeptDate &date, const char *pattern, uint64_t locale, uint64_t zone)
+bool fill(KeptDate &date, const char *pattern, const Defaults &defaults)
 {
     OwnedStr name{RkoStringDup(pattern)};
     drop(date);
@@ -53,20 +66,18 @@ bool fill(KeptDate &date, const char *pattern, uint64_t locale, uint64_t zone)
         return false;
     }
     date.pattern = name.take();
-    date.locale = locale;
-    date.zone = zone;
+    date.defaults = defaults;
     return true;
 }
 
 /// The kept form of a pattern; null when it cannot be kept.
 KeptDate *keptDate(const char *pattern)
 {
-    const uint64_t locale = defaultLocaleNumber();
-    const uint64_t zone = defaultZoneNumber();
+    const Defaults defaults = Defaults::present();
     KeptDate &date = placeFor(pattern);
-    const bool isFresh = date.format.isWhole() && isSameOrAbsent(date.pattern, pattern) &&
-                         date.locale == locale && date.zone == zone;
-    return isFresh || fill(date, pattern, locale, zone) ? &date : nullptr;
+    const bool isFresh =
+        date.format.isWhole() && isSameOrAbsent(date.pattern, pattern) && date.defaults == defaults;
+    return isFresh || fill(date, pattern, defaults) ? &date : nullptr;
 }
 
 void appendFromScratch(CxUStringBuff *out, const char *pattern, UDate time)

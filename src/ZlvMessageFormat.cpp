@@ -11,7 +11,7 @@
 namespace zelvo {
 namespace {
 
-/// What the reading of a pattern depends on. Its dates, if there are any, are in the default zone.
+/// What the reading of a pattern depends on. The zone matters to its dates, if there are any.
 struct PatternKey {
     const UChar *pattern;
     const char *locale;
@@ -51,6 +51,32 @@ struct KeptFormat {
 
 constinit KeptTable<KeptFormat> kept;
 
+/// Tells whether a text begins with a word, in ASCII letters of either case.
+bool beginsWith(const UChar *text, const char *word)
+{
+    for (; *word != '\0'; ++text, ++word)
+        if ((*text | 0x20) != *word)
+            return false;
+    return true;
+}
+
+/// Tells whether a pattern may ask for dates; text that reads like it counts too. The others do
+/// without the default zone. ICU finds the zone out, from the environment, when it is asked for the
+/// first time, and that must not be earlier than without keeping.
+bool mayShowDates(const UChar *pattern)
+{
+    for (const UChar *c = u_strchr(pattern, u','); c != nullptr && *c != 0; ++c)
+        if (beginsWith(c, "date") || beginsWith(c, "time"))
+            return true;
+    return false;
+}
+
+PatternKey keyOf(const UChar *pattern, const char *locale)
+{
+    const uint64_t zone = mayShowDates(pattern) ? defaultZoneNumber() : 0;
+    return {pattern, locale, defaultLocaleNumber(), zone};
+}
+
 UMessageFormat *openFormat(const UChar *pattern, const char *locale)
 {
     UErrorCode status = U_ZERO_ERROR;
@@ -82,7 +108,7 @@ MessageFormat::MessageFormat(const UChar *pattern, const char *locale)
         format_ = openFormat(pattern, locale);
         return;
     }
-    const PatternKey key{pattern, locale, defaultLocaleNumber(), defaultZoneNumber()};
+    const PatternKey key = keyOf(pattern, locale);
     const KeptFormat *found =
         kept.find(key.hash(), [&](const KeptFormat &entry) { return entry.is(key); });
     format_ = found != nullptr ? found->format : openFormat(pattern, locale);

@@ -2,6 +2,7 @@
 #include "CxIcuDefaults.h"
 
 #include <unicode/ucal.h>
+#include <unicode/ucnv.h>
 #include <unicode/uloc.h>
 
 namespace zelvo {
@@ -19,6 +20,12 @@ uint64_t DefaultZone::number()
     const int32_t length = ucal_getDefaultTimeZone(name, CAPACITY, &status);
     const bool isKnown = U_SUCCESS(status) && length < CAPACITY;
     return name_.numberOf(name, isKnown ? static_cast<size_t>(length) : size_t{CAPACITY});
+}
+
+uint64_t DefaultConverter::number()
+{
+    const char *name = ucnv_getDefaultName();
+    return name_.numberOf(name, name != nullptr ? std::strlen(name) : SIZE_MAX);
 }
 
 } // namespace zelvo

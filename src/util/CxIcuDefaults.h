@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// Follows ICU's default locale and default zone, which a program may change at any time. What is
+// Follows ICU's default locale, zone and converter, which a program may change at any time. What is
 // kept for one default must not be used under another.
 #pragma once
 
@@ -52,6 +52,16 @@ private:
     static constexpr int32_t CAPACITY = 128;
 
     NumberedName<char16_t, CAPACITY> name_;
+};
+
+/// The default converter, for one owner who serialises its use.
+class DefaultConverter {
+public:
+    /// The present one's number.
+    uint64_t number();
+
+private:
+    NumberedName<char, 64> name_;
 };
 
 } // namespace zelvo
