@@ -70,7 +70,9 @@ bool DateFormat::openDefaultForm()
     UErrorCode status = U_ZERO_ERROR;
     showsZone_ = true;
     format_ = openFormat(u"yyyy-MM-dd HH:mm:ss.SSS", &status);
-    calendar_ = ucal_open(nullptr, -1, nullptr, UCAL_DEFAULT, &status);
+    // Not a calendar of the default zone: another thread may have changed that meanwhile.
+    if (format_ != nullptr)
+        calendar_ = ucal_clone(udat_getCalendar(format_), &status);
     return format_ != nullptr;
 }
 
