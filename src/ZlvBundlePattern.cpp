@@ -92,7 +92,7 @@ BundlePattern::BundlePattern(const ZlvI18Msg *message, UErrorCode *status)
         bundle = temporary_ = openBundle(message->bundle, message->locale, status);
     int32_t length = 0;
     pattern_ = ures_getStringByKey(bundle, message->key, &length, status);
-    if (keeps && U_SUCCESS(*status))
+    if (keeps && U_SUCCESS(*status) && key.defaultLocale == defaultLocaleNumber())
         keep(key, pattern_);
 }
 

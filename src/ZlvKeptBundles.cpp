@@ -70,7 +70,7 @@ UResourceBundle *keptBundle(const char *name, const char *locale, UErrorCode *st
     if (!nameCopy || (!localeCopy && locale != nullptr))
         return nullptr;
     UResourceBundle *bundle = openBundle(name, locale, status);
-    if (bundle == nullptr || U_FAILURE(*status)) {
+    if (bundle == nullptr || U_FAILURE(*status) || defaultLocaleNumber() != defaultLocale) {
         ures_close(bundle);
         return nullptr;
     }

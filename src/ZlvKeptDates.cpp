@@ -61,7 +61,8 @@ bool fill(KeptDate &date, const char *pattern, const Defaults &defaults)
 {
     OwnedStr name{RkoStringDup(pattern)};
     drop(date);
-    if ((pattern != nullptr && !name) || !date.format.open(pattern) || !date.format.isWhole()) {
+    const bool isOpen = (pattern == nullptr || name) && date.format.open(pattern);
+    if (!isOpen || !date.format.isWhole() || defaults != Defaults::present()) {
         drop(date);
         return false;
     }

@@ -54,8 +54,8 @@ KeptIntegers *learn(const char *locale, uint64_t defaultLocale)
     integers->isRegular = integers->forms.learn(locale);
     integers->locale = name.take();
     integers->defaultLocale = defaultLocale;
-    integers->isUsed = true;
-    return integers;
+    integers->isUsed = defaultLocaleNumber() == defaultLocale;
+    return integers->isUsed ? integers : nullptr;
 }
 
 } // namespace

@@ -18,6 +18,12 @@ struct PatternKey {
     uint64_t defaultLocale;
     uint64_t defaultZone;
 
+    /// Tells whether another key of the same pattern names the same defaults.
+    bool isAs(const PatternKey &other) const
+    {
+        return defaultLocale == other.defaultLocale && defaultZone == other.defaultZone;
+    }
+
     uint64_t hash() const
     {
         const auto length = static_cast<size_t>(u_strlen(pattern));
@@ -112,7 +118,8 @@ MessageFormat::MessageFormat(const UChar *pattern, const char *locale)
     const KeptFormat *found =
         kept.find(key.hash(), [&](const KeptFormat &entry) { return entry.is(key); });
     format_ = found != nullptr ? found->format : openFormat(pattern, locale);
-    isKept_ = found != nullptr || (format_ != nullptr && keep(key, format_));
+    isKept_ = found != nullptr ||
+              (format_ != nullptr && key.isAs(keyOf(pattern, locale)) && keep(key, format_));
 }
 
 MessageFormat::~MessageFormat()
