@@ -193,7 +193,7 @@ protected:
                     "%zu semaphores left unusable\n",
                     GetParam().name, firstFaults_, runs_, recordsAcknowledged_, unusable_);
         print("after kills", afterKills_);
-        print("after kills and failing calls", afterFailures_);
+        print("with failing calls", afterFailures_);
     }
 
     OwnSemaphore semaphore_;

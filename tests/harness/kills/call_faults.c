@@ -53,10 +53,21 @@ static int fail(int code)
         raise(SIGKILL);                                                                            \
     return result
 
+int stat(const char *path, struct stat *facts)
+{
+    MAKE(int, CALL_STAT, fail(EIO), syscall(SYS_newfstatat, AT_FDCWD, path, facts, 0));
+}
+
+int fstatat(int directory, const char *path, struct stat *facts, int flags)
+{
+    MAKE(int, CALL_STAT, fail(EIO), syscall(SYS_newfstatat, directory, path, facts, flags));
+}
+
+/* Without a path it asks about an open file. */
 int statx(int directory, const char *path, int flags, unsigned wanted, struct statx *facts)
 {
-    MAKE(int, path[0] != '\0' ? CALL_STAT : CALL_FSTAT, fail(EIO),
-         syscall(SYS_statx, directory, path, flags, wanted, facts));
+    const enum FaultyCall call = *path == '\0' ? CALL_FSTAT : CALL_STAT;
+    MAKE(int, call, fail(EIO), syscall(SYS_statx, directory, path, flags, wanted, facts));
 }
 
 int open(const char *path, int flags, ...)
