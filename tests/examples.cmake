@@ -19,10 +19,12 @@ foreach(file IN ITEMS rules unicode)
         0 ${examples}/properties/${file}.output
         $<TARGET_FILE:show_config> ${examples}/properties/${file}.properties)
 endforeach()
-zelvo_script_test(record_layouts_runs check_output
-    0 ${examples}/record_layouts.output $<TARGET_FILE:record_layouts>)
-set_tests_properties(record_layouts_runs PROPERTIES
-    WORKING_DIRECTORY ${PROJECT_BINARY_DIR}/examples) # its bundle has a relative path
+foreach(example IN ITEMS record_layouts messages)
+    zelvo_script_test(${example}_runs check_output
+        0 ${examples}/${example}.output $<TARGET_FILE:${example}>)
+    set_tests_properties(${example}_runs PROPERTIES
+        WORKING_DIRECTORY ${PROJECT_BINARY_DIR}/examples) # its bundle has a relative path
+endforeach()
 zelvo_script_test(show_config_refuses_a_key_without_dot check_output
     1 ${examples}/properties/no_dot.output
     $<TARGET_FILE:show_config> ${examples}/properties/no_dot.properties)
