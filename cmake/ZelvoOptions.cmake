@@ -29,6 +29,14 @@ else()
     set(ZELVO_DELIVERED $<CONFIG:Release,RelWithDebInfo,MinSizeRel>)
 endif()
 
+# A delivered build does not depend on where it was made: paths in it begin at the source tree.
+function(zelvo_map_paths target)
+    foreach(directory IN ITEMS ${PROJECT_SOURCE_DIR} ${PROJECT_BINARY_DIR})
+        target_compile_options(${target} PRIVATE
+            $<${ZELVO_DELIVERED}:-ffile-prefix-map=${directory}=.>)
+    endforeach()
+endfunction()
+
 function(zelvo_harden objects library)
     set(compile -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=3 -fstack-protector-strong -fstack-clash-protection)
     set(link LINKER:-z,relro LINKER:-z,now LINKER:-z,noexecstack)
