@@ -232,7 +232,8 @@ WideText xmlRecord(const EventStory &event, const WideText &date, const XmlSetti
     if (settings.isFirst)
         addItems(out, settings, true);
     openElement(out, event, isMessage);
-    out.add(" <Time Millis=\"").add(std::to_string(event.time + (faultIsSeeded() ? 1 : 0)));
+    const int wrong = faultIsSeeded() && event.level == 5000 ? 1 : 0;
+    out.add(" <Time Millis=\"").add(std::to_string(event.time + wrong));
     out.add("\">").add(date).add("</Time>\n");
     addItems(out, settings, false);
     out.add(" <LogText><![CDATA[").add(event.text).add("]]></LogText>\n");
