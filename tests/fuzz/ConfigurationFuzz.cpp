@@ -10,6 +10,8 @@
 #include "ZlvLevel.h"
 #include "ZlvLogger.h"
 #include "ZlvObject.h"
+#include "ZlvOwned.h"
+#include "ZlvToolkitIntl.h"
 #include "support/Defaults.h"
 #include "support/Fuzz.h"
 #include "support/Life.h"
@@ -145,6 +147,16 @@ void keepFewFiles(ZlvObject *object)
         ZlvSetObjPropInt(object, "maxFiles", MOST_FILES);
 }
 
+/// Listeners exist that no line of the file is about: they inherit.
+void keepFewFilesOfAll()
+{
+    StringToObjMapIterator at = zlvIntlStringToObjMapIterator(ZLV_TK_INSTANCES);
+    for (; zlvIntlStringToObjMapIterHasNext(at) != 0; at = zlvIntlStringToObjMapIterNext(at)) {
+        const zelvo::ObjectRef object{zlvIntlStringToObjMapIterGetVal(at)};
+        keepFewFiles(object.get());
+    }
+}
+
 void log(ZlvObject *logger, std::vector<ZlvStatus> &results)
 {
     results.push_back(ZlvLogUText(logger, u"ABC1234E {0}, {1,number,integer}", u"Tee", 3));
@@ -167,7 +179,7 @@ std::vector<ZlvStatus> liveThrough(const Configs &configs)
     std::vector<ZlvObject *> objects;
     for (const Config &config : configs)
         objects.push_back(madeFrom(config));
-    std::for_each(objects.begin(), objects.end(), keepFewFiles);
+    keepFewFilesOfAll();
     std::vector<ZlvStatus> results;
     logThrough(objects, results);
     for (const ZlvStatus &result : results)
