@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ZlvDeferredFree.h"
 
+#include <functional>
 #include <type_traits>
 
 #include "CxMemory.h"
@@ -15,8 +16,8 @@ class DeadList {
 public:
     void push(T *record)
     {
-        using Link = std::remove_reference_t<decltype(record->*LINK)>;
-        record->*LINK = reinterpret_cast<Link>(head_);
+        auto &link = std::invoke(LINK, *record);
+        link = reinterpret_cast<std::remove_reference_t<decltype(link)>>(head_);
         head_ = record;
     }
 
@@ -24,7 +25,7 @@ public:
     {
         while (head_ != nullptr) {
             T *record = head_;
-            head_ = reinterpret_cast<T *>(record->*LINK);
+            head_ = reinterpret_cast<T *>(std::invoke(LINK, *record));
             RkoMemoryFree(record);
         }
     }
@@ -33,8 +34,15 @@ private:
     T *head_ = nullptr;
 };
 
-// What a walk may still read is not used as a link: next, prev, and the value of a map node.
-constinit DeadList<ZlvObject, &ZlvObject::vars> deadObjects;
+/// What an object has for its kind alone is not looked at once it has no class.
+void *&wordOfItsKind(ZlvObject &object)
+{
+    return object.handler.reserved;
+}
+
+// What somebody may still read is not used as a link: next, prev and the value of a map node in a
+// walk, and the variables of an object that foreign code has destroyed in the middle of its entry.
+constinit DeadList<ZlvObject, wordOfItsKind> deadObjects;
 constinit DeadList<ListenerGroup, &ListenerGroup::last> deadGroups;
 constinit DeadList<ListenerGroupNode, &ListenerGroupNode::owner> deadListenerNodes;
 constinit DeadList<StringToObjMapNode, &StringToObjMapNode::map> deadObjectNodes;
