@@ -20,6 +20,11 @@ TEST(ZlvReadPropsHex, OnlyDigitsAndTheLettersAToFHaveAValue)
     EXPECT_EQ(digits, "0123456789ABCDEFabcdef");
 }
 
+TEST(ZlvReadPropsHex, WithoutASlotNothingHasAValue)
+{
+    EXPECT_EQ(zlvRdprHexConv('7', nullptr), 0);
+}
+
 TEST(ZlvReadPropsHex, LettersCountFromZero)
 {
     const struct {

@@ -216,6 +216,12 @@ TEST_P(ZlvReadPropsState, KnowsEveryByteOnce)
     EXPECT_EQ(seen, std::vector<int>(256, 1));
 }
 
+TEST_P(ZlvReadPropsState, WithoutAContextIsAnError)
+{
+    for (int code = 0; code < 256; ++code)
+        EXPECT_EQ(handlers[GetParam()](static_cast<char>(code), nullptr), Failed) << code;
+}
+
 // With buffers that never held anything the next state is the same, but for emits, which have no
 // value text and fail.
 TEST_P(ZlvReadPropsState, AnswersTheSameForFreshBuffersExceptForEmits)
@@ -243,6 +249,11 @@ TEST(ZlvReadPropsStates, EmitsKeepKeyAndValueForTheEndOfInput)
         EXPECT_EQ(Context::bytes(context.key), "k");
         EXPECT_EQ(Context::bytes(context.value), "v");
     }
+}
+
+TEST(ZlvReadPropsStates, AnEmitWithoutAContextTakesNothing)
+{
+    EXPECT_EQ(zlvRdprEmitCfg(nullptr), 0);
 }
 
 TEST(ZlvReadPropsStates, AnEmitWithoutMemoryIsAnError)

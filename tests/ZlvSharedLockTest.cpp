@@ -131,6 +131,19 @@ TEST_P(ZlvSharedLockPauses, GoOnAfterASignalWithWhatIsLeft)
     EXPECT_EQ(times, (std::vector<long>{0, 7, 7}));
 }
 
+TEST_P(ZlvSharedLockPauses, ThatCannotBeMadeAreGivenUp)
+{
+    int pauses = 0;
+    system_.nanosleep = [&pauses](const timespec *, timespec *) {
+        ++pauses;
+        errno = EINVAL;
+        return -1;
+    };
+    failures_ = 1;
+    EXPECT_TRUE(lockSem());
+    EXPECT_EQ(pauses, 1);
+}
+
 TEST_P(ZlvSharedLockPauses, FollowOneFailure)
 {
     failures_ = 1;

@@ -47,6 +47,8 @@ struct FakeSystem {
     std::function<pid_t()> fork;
     std::function<int(const char *, mode_t)> mkdir;
     std::function<int(const char *, mode_t)> chmod;
+    std::function<int(int, struct stat *)> fstat;
+    std::function<ssize_t(int, const void *, size_t)> write;
     std::function<int(int)> fsync;
     std::function<int(int, off_t)> ftruncate;
     std::function<int(key_t, int, int)> semget;
