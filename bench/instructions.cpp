@@ -2,7 +2,7 @@
 // Logs records of one kind, for scripts/gate, which counts the instructions that they take:
 //     zelvo_bench_instructions KIND RECORDS
 // Without arguments it prints the kinds, and with "versions" what the figures depend on. It runs in
-// the directory that holds the message bundle and leaves a log file there.
+// the directory that holds the message bundle.
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -20,10 +20,33 @@
 
 namespace {
 
-constexpr const char *LOG_FILE = "instructions.log";
 constexpr const char *BUNDLE = "./messages";
 constexpr const char *NO_ROLLOVER = "2000000000";
 constexpr unsigned WARM_UP = 100;
+
+/// A log file whose path has the same length in each run.
+class LogFile {
+public:
+    LogFile() : isThere_(mkdtemp(directory_) != nullptr)
+    {
+        static_cast<void>(std::snprintf(path_, sizeof path_, "%s/records.log", directory_));
+    }
+    LogFile(const LogFile &) = delete;
+    LogFile &operator=(const LogFile &) = delete;
+    ~LogFile()
+    {
+        unlink(path_);
+        rmdir(directory_);
+    }
+
+    bool isThere() const { return isThere_; }
+    const char *path() const { return path_; }
+
+private:
+    char directory_[32] = "/tmp/zelvo.XXXXXX";
+    char path_[64];
+    bool isThere_;
+};
 
 /// What a kind of record is made with.
 struct Kind {
@@ -77,7 +100,7 @@ const Kind *kindNamed(const char *name)
 
 /// A logger, bound to a handler with its formatter.
 struct Tree {
-    explicit Tree(const Kind &kind)
+    Tree(const Kind &kind, const LogFile &file)
         : logger(ZlvGetObject("logger", kind.logger)),
           handler(ZlvGetObject("handler", kind.handler)),
           formatter(ZlvGetObject("formatter", kind.formatter))
@@ -86,7 +109,7 @@ struct Tree {
         ZlvSetObjProp(logger, "product", "Shop");
         ZlvSetObjProp(logger, "component", "Store");
         ZlvSetObjProp(logger, "server", "store17.example.org");
-        ZlvSetObjProp(handler, "fileName", LOG_FILE);
+        ZlvSetObjProp(handler, "fileName", file.path());
         ZlvSetObjProp(handler, "maxFileBytes", NO_ROLLOVER);
         ZlvSetObjPropInt(handler, "MPFileSemKey", semaphoreKey());
         if (kind.locale != nullptr)
@@ -141,25 +164,25 @@ unsigned linesIn(const char *path)
 }
 
 /// Tells whether the log file has at least a line for each record, or none if all were refused.
-bool isWritten(const Kind &kind, unsigned records)
+bool isWritten(const Kind &kind, const LogFile &file, unsigned records)
 {
-    const unsigned lines = linesIn(LOG_FILE);
+    const unsigned lines = linesIn(file.path());
     return kind.logOne == logRefused ? lines == 0 : lines >= records;
 }
 
 bool run(const Kind &kind, unsigned records)
 {
-    unlink(LOG_FILE);
-    if (!ZlvOpenToolkit(nullptr, nullptr))
+    const LogFile file;
+    if (!file.isThere() || !ZlvOpenToolkit(nullptr, nullptr))
         return false;
     {
-        const Tree tree{kind};
+        const Tree tree{kind, file};
         logRecords(kind, tree.logger, WARM_UP);
         countedRecords(kind, tree.logger, records);
     }
     ZlvCloseToolkit();
     semctl(semget(semaphoreKey(), 0, 0), 0, IPC_RMID);
-    return isWritten(kind, WARM_UP + records);
+    return isWritten(kind, file, WARM_UP + records);
 }
 
 /// Runs in a thread: its stack and its heap begin at a page, wherever the environment and the path
@@ -170,7 +193,7 @@ int runInThread(const Kind &kind, unsigned records)
     bool isDone = false;
     std::thread([&] { isDone = run(kind, records); }).join();
     if (!isDone)
-        std::fprintf(stderr, "%s: the records are not in %s\n", kind.name, LOG_FILE);
+        std::fprintf(stderr, "%s: the records have not been written\n", kind.name);
     return isDone ? 0 : 1;
 }
 
