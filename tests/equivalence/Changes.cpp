@@ -70,6 +70,8 @@ void setDefaults(World &world)
 
 void changeLocale(World &world)
 {
+    if (world.hasUnknownLocales)
+        return;
     setLocale(world);
     world.transcript.count("changes of the default locale");
 }

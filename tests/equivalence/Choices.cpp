@@ -55,18 +55,17 @@ constexpr const char *LOCALES[] = {
     "EN_us",
     "root",
     "und",
-    "C",
     "",
-    "xx_YY",
-    "nonsense",
-    "no locale!",
     "@numbers=arab",
     "en_US@calendar=buddhist",
     "en@calendar=nonsense;numbers=nonsense",
-    "x",
-    "i-klingon",
     "de_DE_a_rather_long_name_of_a_variant_that_nobody_has_ever_needed_for_anything_at_all_yet",
 };
+
+constexpr const char *UNKNOWN_LOCALES[] = {"C",          "xx_YY", "nonsense",
+                                           "no locale!", "x",     "i-klingon"};
+
+bool hasUnknownLocales = false;
 
 constexpr const char16_t *ZONES[] = {
     u"UTC",
@@ -238,9 +237,14 @@ uint32_t anyLength(Random &random)
 
 } // namespace
 
+void useUnknownLocales(bool use)
+{
+    hasUnknownLocales = use;
+}
+
 const char *anyLocale(Random &random)
 {
-    return random.of(LOCALES);
+    return hasUnknownLocales && random.oneIn(4) ? random.of(UNKNOWN_LOCALES) : random.of(LOCALES);
 }
 
 const char16_t *anyZone(Random &random)

@@ -8,6 +8,8 @@
 
 namespace zelvo_equivalence {
 
+/// Whether anyLocale() may give a locale that ICU knows nothing of.
+void useUnknownLocales(bool use);
 const char *anyLocale(Random &random);
 const char16_t *anyZone(Random &random);
 const char *anyDatePattern(Random &random); ///< now and then null, which means the default form

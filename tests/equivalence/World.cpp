@@ -146,8 +146,10 @@ void Tree::replaceFormatter(Random &random, Transcript &transcript)
 }
 
 World::World(uint64_t seed, const char *transcriptPath)
-    : endsIcu(seed % 2 == 0), random(seed), transcript(transcriptPath), patterns(!endsIcu)
+    : endsIcu(seed % 2 == 0), hasUnknownLocales(seed % 4 >= 2), random(seed),
+      transcript(transcriptPath), patterns(!endsIcu)
 {
+    useUnknownLocales(hasUnknownLocales);
     std::ofstream{LOG_FILE, std::ios::trunc};
     log.open(LOG_FILE, std::ios::binary);
 }

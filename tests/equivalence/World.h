@@ -76,6 +76,10 @@ struct World {
     /// ICU can be brought to its end and used again only if no message has asked it for a date, so
     /// scenarios do one or the other.
     const bool endsIcu;
+    /// ICU writes a locale that it does not know like the default one, and remembers that for a
+    /// while when the default has changed. So the default stays in scenarios that have unknown
+    /// locales.
+    const bool hasUnknownLocales;
 
     Random random;
     Transcript transcript;
