@@ -40,7 +40,9 @@ enum CallFault {
     FAULT_KILL_BEFORE,
     FAULT_KILL_WITHIN, /**< a write is cut in half; any other call is made, and then the kill */
     FAULT_KILL_AFTER,
-    FAULT_FAIL, /**< the call is not made; a semaphore set is removed, which is how those fail */
+    FAULT_CUT,     /**< a write takes half of its bytes; any other call is made */
+    FAULT_SWALLOW, /**< a write takes nothing and says it took all; any other call is made */
+    FAULT_FAIL,    /**< the call is not made; a semaphore set is removed, which is how those fail */
     FAULT_KINDS
 };
 
@@ -52,8 +54,18 @@ struct CallTrace {
     uint8_t calls[MOST_CALLS];
 };
 
-/** Counts calls from now on, and lets the fault befall the one of that number. */
-void plotCallFault(struct CallTrace *trace, uint32_t number, enum CallFault fault);
+/** What befalls so many calls in a row, from one on; none for the number 0. */
+struct CallPlot {
+    uint32_t number;
+    enum CallFault fault;
+    uint32_t count;
+    int code; /**< with which calls fail; 0 for EIO, and for a semaphore set that is removed. With a
+                   code the calls that give a semaphore its value or give it back are made: they
+                 fail with the set alone. */
+};
+
+/** Counts calls from now on, and lets the plot befall them; without a trace they are left alone. */
+void plotCallFault(struct CallTrace *trace, struct CallPlot plot);
 
 #ifdef __cplusplus
 }

@@ -2,6 +2,7 @@
 #include "FaultyRun.h"
 
 #include <algorithm>
+#include <filesystem>
 
 #include <fcntl.h>
 #include <sys/mman.h>
@@ -15,6 +16,7 @@ namespace zelvo_test {
 namespace {
 
 constexpr unsigned SECONDS_TO_HANG = 60;
+constexpr int DESCRIPTOR_LEFT = 2; // exit status
 
 /// The trace of one process after the other.
 CallTrace *sharedTrace()
@@ -54,6 +56,12 @@ private:
     int ends_[2] = {-1, -1};
 };
 
+auto descriptors()
+{
+    const std::filesystem::directory_iterator all("/proc/self/fd");
+    return std::distance(begin(all), end(all));
+}
+
 int logRecords(const char *handlerClass, const Job &job, const NumberPipe &acknowledged,
                Acknowledges when)
 {
@@ -89,11 +97,15 @@ FaultyRun runFaulty(const char *handlerClass, const Job &job, Fault fault, Ackno
     const NumberPipe acknowledged;
     Child process([&] {
         alarm(SECONDS_TO_HANG);
-        plotCallFault(&trace, fault.number, fault.kind);
-        return logRecords(handlerClass, job, acknowledged, when);
+        const auto before = descriptors();
+        plotCallFault(&trace, {fault.number, fault.kind, fault.count, fault.code});
+        const int result = logRecords(handlerClass, job, acknowledged, when);
+        plotCallFault(nullptr, {});
+        return result == 0 && descriptors() != before ? DESCRIPTOR_LEFT : result;
     });
-    const bool hasEnded = process.result() == 0;
-    return {hasEnded, acknowledged.takeAll(), callsOf(trace)};
+    const int result = process.result();
+    return {result == 0 || result == DESCRIPTOR_LEFT, result == DESCRIPTOR_LEFT,
+            acknowledged.takeAll(), callsOf(trace)};
 }
 
 } // namespace zelvo_test

@@ -9,10 +9,12 @@
 
 namespace zelvo_test {
 
-/// A fault at the call of that number; none for 0.
+/// A fault at the call of that number, or at so many from there on; none for 0.
 struct Fault {
     uint32_t number = 0;
     CallFault kind = FAULT_NONE;
+    uint32_t count = 1;
+    int code = 0; ///< with which calls fail; 0 leaves the choice
 };
 
 /// When a process tells that a record is safe.
@@ -20,7 +22,8 @@ enum class Acknowledges { AFTER_THE_CALL, TOO_EARLY };
 
 /// What became of a run.
 struct FaultyRun {
-    bool hasEnded = false; ///< by itself, rather than by a signal
+    bool hasEnded = false;         ///< by itself, rather than by a signal
+    bool leavesDescriptor = false; ///< open, that was not before
     std::vector<uint32_t> acknowledged;
     std::vector<FaultyCall> calls;
 };

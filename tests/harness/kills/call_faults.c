@@ -11,17 +11,23 @@
 #include <sys/sem.h>
 #include <sys/stat.h>
 #include <sys/syscall.h>
+#include <time.h>
 #include <unistd.h>
 
 static struct CallTrace *trace;
-static uint32_t chosen;
-static enum CallFault itsFault;
+static struct CallPlot plot;
 
-void plotCallFault(struct CallTrace *shared, uint32_t number, enum CallFault fault)
+void plotCallFault(struct CallTrace *shared, struct CallPlot whole)
 {
-    chosen = number;
-    itsFault = fault;
+    plot = whole;
     trace = shared;
+}
+
+static enum CallFault faultOf(uint32_t number)
+{
+    const int isMeant =
+        plot.number != 0 && number >= plot.number && number - plot.number < plot.count;
+    return isMeant ? plot.fault : FAULT_NONE;
 }
 
 /* Numbers a call, and gives what is to become of it. */
@@ -31,13 +37,13 @@ static enum CallFault meet(enum FaultyCall call)
         return FAULT_NONE;
     if (trace->count < MOST_CALLS)
         trace->calls[trace->count] = (uint8_t)call;
-    return ++trace->count == chosen ? itsFault : FAULT_NONE;
+    return faultOf(++trace->count);
 }
 
 /* Fails instead of the call; the answer of a call that fails. */
 static int fail(int code)
 {
-    errno = code;
+    errno = plot.code != 0 ? plot.code : code;
     return -1;
 }
 
@@ -86,14 +92,20 @@ ssize_t read(int descriptor, void *bytes, size_t length)
 
 static size_t lengthToWrite(size_t length)
 {
-    const int isCut = trace != NULL && trace->count + 1 == chosen && itsFault == FAULT_KILL_WITHIN;
-    return isCut ? length / 2 : length;
+    const enum CallFault fault = trace != NULL ? faultOf(trace->count + 1) : FAULT_NONE;
+    return fault == FAULT_KILL_WITHIN || fault == FAULT_CUT ? length / 2 : length;
+}
+
+static ssize_t writeOrSwallow(int descriptor, const void *bytes, size_t length)
+{
+    const int isSwallowed = trace != NULL && faultOf(trace->count) == FAULT_SWALLOW;
+    return isSwallowed ? (ssize_t)length : syscall(SYS_write, descriptor, bytes, length);
 }
 
 ssize_t write(int descriptor, const void *bytes, size_t whole)
 {
     const size_t length = lengthToWrite(whole);
-    MAKE(ssize_t, CALL_WRITE, fail(EIO), syscall(SYS_write, descriptor, bytes, length));
+    MAKE(ssize_t, CALL_WRITE, fail(EIO), writeOrSwallow(descriptor, bytes, length));
 }
 
 off_t lseek(int descriptor, off_t offset, int whence)
@@ -111,9 +123,16 @@ int fsync(int descriptor)
     MAKE(int, CALL_FSYNC, fail(EIO), syscall(SYS_fsync, descriptor));
 }
 
+/* A descriptor is gone even if closing it fails. */
+static int failToClose(int descriptor)
+{
+    syscall(SYS_close, descriptor);
+    return fail(EIO);
+}
+
 int close(int descriptor)
 {
-    MAKE(int, CALL_CLOSE, fail(EIO), syscall(SYS_close, descriptor));
+    MAKE(int, CALL_CLOSE, failToClose(descriptor), syscall(SYS_close, descriptor));
 }
 
 static long removeAny(const char *path)
@@ -154,16 +173,31 @@ static int failWithoutSet(int id)
     return fail(EIDRM);
 }
 
+static int failToTake(int id)
+{
+    return plot.code != 0 ? fail(plot.code) : failWithoutSet(id);
+}
+
 int semctl(int id, int number, int command, ...)
 {
     va_list rest;
     va_start(rest, command);
     void *argument = va_arg(rest, void *);
     va_end(rest);
+    if (plot.code != 0)
+        return (int)syscall(SYS_semctl, id, number, command, argument);
     MAKE(int, CALL_SEMCTL, failWithoutSet(id), syscall(SYS_semctl, id, number, command, argument));
+}
+
+/* Nobody waits for the second that passes before a call is made again. */
+int nanosleep(const struct timespec *time, struct timespec *rest)
+{
+    return trace != NULL ? 0 : (int)syscall(SYS_nanosleep, time, rest);
 }
 
 int semop(int id, struct sembuf *steps, size_t count)
 {
-    MAKE(int, CALL_SEMOP, failWithoutSet(id), syscall(SYS_semop, id, steps, count));
+    if (count > 1 && plot.code != 0)
+        return (int)syscall(SYS_semop, id, steps, count);
+    MAKE(int, CALL_SEMOP, failToTake(id), syscall(SYS_semop, id, steps, count));
 }
