@@ -4,19 +4,21 @@
 #include "support/FileHandlerFixture.h"
 
 // What a fake of it hands its call on to (tests/CMakeLists.txt).
-extern "C" int __real_fstat(int file, struct stat *facts);
+extern "C" int __real_statx(int file, const char *path, int flags, unsigned wanted,
+                            struct statx *facts);
 
 namespace zelvo_test {
 namespace {
 
 class ZlvFileHandlerUnknownFile : public FileHandlerFixture {
 protected:
-    /// Lets the call of fstat of this number fail, counted from now on.
-    void failFstat(int number)
+    /// Lets the question about an open file that has this number, counted from now on, fail.
+    void failQuestion(int number)
     {
-        system_.fstat = [number, calls = 0](int file, struct stat *facts) mutable {
-            if (++calls != number)
-                return __real_fstat(file, facts);
+        system_.statx = [number, questions = 0](int file, const char *path, int flags,
+                                                unsigned wanted, struct statx *facts) mutable {
+            if (*path != '\0' || ++questions != number)
+                return __real_statx(file, path, flags, wanted, facts);
             errno = EIO;
             return -1;
         };
@@ -30,7 +32,7 @@ TEST_F(ZlvFileHandlerUnknownFile, ThatCannotBeToldFromOthersIsMeasuredEachTime)
 {
     write("app.log", "old\n");
     handler("fileName", "app.log", "maxFileSize", "10");
-    failFstat(1);
+    failQuestion(1);
     log(u"abc");
     log(u"d");
     EXPECT_EQ(faults_.reports, 0u);
@@ -43,7 +45,7 @@ TEST_F(ZlvFileHandlerUnknownFile, ThatCannotBeMeasuredIsNotRolledOver)
 {
     write("app.log", "full");
     framedHandler("fileName", "app.log", "maxFileSize", "4");
-    failFstat(2);
+    failQuestion(2);
     EXPECT_TRUE(succeeded(openHandler()));
     EXPECT_EQ(faults_.reports, 1u);
     EXPECT_TRUE(failedWith(faults_.reported, EIO));

@@ -47,7 +47,7 @@ struct FakeSystem {
     std::function<pid_t()> fork;
     std::function<int(const char *, mode_t)> mkdir;
     std::function<int(const char *, mode_t)> chmod;
-    std::function<int(int, struct stat *)> fstat;
+    std::function<int(int, const char *, int, unsigned, struct statx *)> statx;
     std::function<ssize_t(int, const void *, size_t)> write;
     std::function<int(int)> fsync;
     std::function<int(int, off_t)> ftruncate;
