@@ -152,6 +152,7 @@ void reopenWithoutIcu(World &world)
     if (world.random.oneIn(2))
         callWithoutToolkit(world);
     world.closeToolkit();
+    callWithoutToolkit(world);
     if (!world.endsIcu)
         return world.openToolkit();
     u_cleanup();
