@@ -2,8 +2,11 @@
 // Date formats that are kept between records. Formatters mostly share one or two forms.
 #include "ZlvKeptDates.h"
 
+#include <unicode/ustring.h>
+
 #include "ZlvDateFormat.h"
 #include "ZlvKept.h"
+#include "ZlvRecord.h"
 #include "ZlvSecondText.h"
 #include "util/CxOwned.h"
 
@@ -56,13 +59,34 @@ KeptDate &placeFor(const char *pattern)
     return free != nullptr ? *free : kept[nextToGo++ % CAPACITY];
 }
 
+/// Tells whether a form lacks nothing. ICU reports no failure for a part that it had no memory for,
+/// and makes some parts no earlier than at the third use. So another form, opened after the first
+/// has been used, has to write the same each time.
+bool isSound(const DateFormat &format, const char *pattern)
+{
+    constexpr int USES = 4;
+    constexpr UDate SAMPLE = 1234567890123;
+    Record written;
+    for (int use = 0; use < USES; ++use)
+        format.append(written.text(), SAMPLE);
+    Record expected;
+    DateFormat other;
+    for (int use = 0; use < USES && (use > 0 || other.open(pattern)); ++use)
+        other.append(expected.text(), SAMPLE);
+    other.close();
+    const OwnedUStr first{written.take()};
+    const OwnedUStr second{expected.take()};
+    return first && second && u_strcmp(first.get(), second.get()) == 0;
+}
+
 /// Opens a form in a place; false when it cannot be kept.
 bool fill(KeptDate &date, const char *pattern, const Defaults &defaults)
 {
     OwnedStr name{RkoStringDup(pattern)};
     drop(date);
     const bool isOpen = (pattern == nullptr || name) && date.format.open(pattern);
-    if (!isOpen || !date.format.isWhole() || defaults != Defaults::present()) {
+    if (!isOpen || !date.format.isWhole() || !isSound(date.format, pattern) ||
+        defaults != Defaults::present()) {
         drop(date);
         return false;
     }
