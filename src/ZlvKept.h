@@ -2,7 +2,8 @@
 // What is kept between records instead of being opened for each again: date formats, patterns of
 // messages and bundles. All of it is used and dropped under the API mutex, bounded in number, and
 // found again by everything that its results depend on, so that a record reads the same with and
-// without. What could not be opened is not kept, nor what another thread changed a default under. The build option ZELVO_KEEP turns it off.
+// without. What could not be opened is not kept, nor what another thread changed a default under.
+// The build option ZELVO_KEEP turns it off.
 #pragma once
 
 #include <cstdint>
