@@ -97,17 +97,17 @@ bool IntegerText::learn(const char *locale)
 
 int32_t IntegerText::write(int32_t value, UChar *area) const
 {
-    char decimal[MOST_DIGITS];
+    uint8_t decimal[MOST_DIGITS];
     int32_t count = 0;
     uint32_t rest = value < 0 ? 0 - static_cast<uint32_t>(value) : static_cast<uint32_t>(value);
     do {
-        decimal[count++] = static_cast<char>(rest % 10);
+        decimal[count++] = static_cast<uint8_t>(rest % 10);
         rest /= 10;
     } while (rest != 0);
     const Form &form = forms_[value < 0 ? 1 : 0][count - 1];
     std::memcpy(area, form.text, sizeof form.text);
     for (int32_t i = 0; i < count; ++i)
-        area[form.places[i]] = digits_[static_cast<size_t>(decimal[count - 1 - i])];
+        area[form.places[i]] = digits_[decimal[count - 1 - i]];
     return form.length;
 }
 

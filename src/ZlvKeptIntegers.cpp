@@ -9,11 +9,11 @@ namespace zelvo {
 namespace {
 
 struct KeptIntegers {
-    bool isUsed;
-    bool isRegular; ///< the locale's integers have the forms in `forms`
     char *locale;
     uint64_t defaultLocale;
     IntegerText forms;
+    bool isUsed;
+    bool isRegular; ///< the locale's integers have the forms in `forms`
 };
 
 constexpr size_t CAPACITY = 16;
