@@ -102,7 +102,7 @@ protected:
 inline const auto handlerClasses =
     testing::Values(HandlerClass{"Alone", ALONE}, HandlerClass{"Shared", SHARED});
 
-/// Tests that need a second user begin with this.
+/// Tests that need a second user begin with this: what is one's own is never refused.
 #define ZELVO_NEEDS_ROOT()                                                                         \
     if (geteuid() != 0)                                                                            \
     GTEST_SKIP() << "only root can become somebody else"

@@ -54,6 +54,7 @@ TEST_P(HostilePlaces, ASocketFailsEachRecord)
 TEST_P(HostilePlaces, AReadOnlyFileSystemFailsEachRecordUntilItCanBeWritten)
 {
     const SmallDisk disk;
+    // Only a mount can become read-only, and mounting takes root.
     if (!disk.isThere())
         GTEST_SKIP() << "no right to mount a file system";
     logTo("fileName", "disk/d/app.log");
@@ -68,6 +69,7 @@ TEST_P(HostilePlaces, AReadOnlyFileSystemFailsEachRecordUntilItCanBeWritten)
 TEST_P(HostilePlaces, AFileSystemThatBecomesReadOnlyFailsTheOpening)
 {
     const SmallDisk disk;
+    // Only a mount can become read-only, and mounting takes root.
     if (!disk.isThere())
         GTEST_SKIP() << "no right to mount a file system";
     logTo("fileName", "disk/app.log");

@@ -175,7 +175,7 @@ private:
         while (!reached() && Clock::now() < end) {
             each();
             settle();
-            usleep(1000); // between two looks
+            usleep(1000); // leaves the processors to those who are looked at; the counts decide
         }
         EXPECT_TRUE(reached());
     }

@@ -129,7 +129,7 @@ public:
             for (Log *log : {&shared_, &own_})
                 changeSomething(*log, random);
             ++ledger_.board().changes[job_.process];
-            std::this_thread::sleep_for(BETWEEN_CHANGES);
+            std::this_thread::sleep_for(BETWEEN_CHANGES); // waits for nothing: it sets the pace
         }
     }
 
