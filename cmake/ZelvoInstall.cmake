@@ -36,6 +36,11 @@ install(FILES ${generated}/zelvo.pc
 install(FILES README.md CHANGELOG.md SECURITY.md LICENSE
     DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT documentation)
 install(DIRECTORY docs examples DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT documentation
-    PATTERN .clang-tidy EXCLUDE)
+    PATTERN .clang-tidy EXCLUDE PATTERN Doxyfile EXCLUDE PATTERN pages.css EXCLUDE)
 install(DIRECTORY packaging/lnav DESTINATION ${CMAKE_INSTALL_DATADIR}/zelvo
     COMPONENT documentation USE_SOURCE_PERMISSIONS)
+
+file(RELATIVE_PATH to_headers ${CMAKE_INSTALL_FULL_DOCDIR} ${CMAKE_INSTALL_FULL_INCLUDEDIR}/zelvo)
+file(RELATIVE_PATH to_lnav ${CMAKE_INSTALL_FULL_DOCDIR} ${CMAKE_INSTALL_FULL_DATADIR}/zelvo/lnav)
+configure_file(cmake/links.cmake.in ${generated}/links.cmake @ONLY)
+install(SCRIPT ${generated}/links.cmake COMPONENT documentation)

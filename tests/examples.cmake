@@ -36,6 +36,14 @@ zelvo_script_test(an_invented_snippet_is_noticed check_doc_snippets
 set_tests_properties(an_invented_snippet_is_noticed PROPERTIES
     PASS_REGULAR_EXPRESSION "not found under examples/:.*int invented")
 
+# Pages lead to files, folders and headings that are there.
+file(GLOB pages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/*.md)
+zelvo_script_test(links_lead_somewhere check_links
+    ${pages} ${PROJECT_SOURCE_DIR}/docs ${PROJECT_SOURCE_DIR}/packaging)
+zelvo_script_test(dead_links_are_found check_links ${CMAKE_CURRENT_SOURCE_DIR}/data/dead_links.md)
+set_tests_properties(dead_links_are_found PROPERTIES PASS_REGULAR_EXPRESSION
+    "no_such_page.md, which is.*#no-such-heading, but.*no_such_page.md#there, which.*1 pages, 5 links, 3 faults")
+
 zelvo_script_test(zelvo_h_leads_to_every_header check_umbrella ${PROJECT_SOURCE_DIR}/include)
 
 # Another project that takes the tree in as a subdirectory.
