@@ -10,7 +10,8 @@ function(zelvo_script_test name script)
 endfunction()
 
 foreach(example IN ITEMS
-        quickstart own_handler reconfigure log_macros cpp_quickstart cpp_own_classes cpp_testing)
+        quickstart own_handler reconfigure log_macros configured_tree syslog_handler languages
+        cpp_quickstart cpp_own_classes cpp_testing)
     zelvo_script_test(${example}_runs check_output
         0 ${examples}/${example}.output $<TARGET_FILE:${example}>)
 endforeach()
@@ -25,6 +26,26 @@ foreach(example IN ITEMS record_layouts messages)
     set_tests_properties(${example}_runs PROPERTIES
         WORKING_DIRECTORY ${PROJECT_BINARY_DIR}/examples) # its bundle has a relative path
 endforeach()
+
+# What syslog(3) is told beside the text: a stand-in for it prints that.
+add_executable(syslog_handler_told ${examples}/syslog_handler.c c/SyslogStandIn.c)
+target_link_libraries(syslog_handler_told PRIVATE zelvo::zelvo zelvo_options)
+target_compile_options(syslog_handler_told PRIVATE -U_FORTIFY_SOURCE) # which would call another one
+get_target_property(definitions syslog_handler COMPILE_DEFINITIONS)
+target_compile_definitions(syslog_handler_told PRIVATE ${definitions})
+set_target_properties(syslog_handler_told PROPERTIES C_STANDARD 11)
+add_dependencies(syslog_handler_told syslog_handler) # its messages
+zelvo_script_test(syslog_handler_sends_priorities check_output
+    0 ${CMAKE_CURRENT_SOURCE_DIR}/data/syslog_handler_told.output $<TARGET_FILE:syslog_handler_told>)
+
+zelvo_script_test(json_lines_runs check_output
+    0 ${examples}/json_lines.output
+    ${Python3_EXECUTABLE} ${CMAKE_CURRENT_SOURCE_DIR}/check_json_lines $<TARGET_FILE:json_lines>)
+zelvo_script_test(faulty_json_is_noticed check_json_lines
+    cp ${CMAKE_CURRENT_SOURCE_DIR}/data/faulty_json_lines.log json_lines.log)
+set_tests_properties(faulty_json_is_noticed PROPERTIES PASS_REGULAR_EXPRESSION
+    "line 1: no JSON.*line 2: no JSON: a name comes twice.*line 3: half of a surr.*line 3: the time is not that.*line 4: the time is not RFC 3339.*line 4: another process.*the last line has no end")
+
 zelvo_script_test(show_config_refuses_a_key_without_dot check_output
     1 ${examples}/properties/no_dot.output
     $<TARGET_FILE:show_config> ${examples}/properties/no_dot.properties)
