@@ -10,7 +10,7 @@ function(zelvo_script_test name script)
 endfunction()
 
 foreach(example IN ITEMS
-        quickstart own_handler reconfigure log_macros configured_tree syslog_handler languages
+        quickstart own_handler reconfigure log_macros configured_tree syslog_handler languages processes
         cpp_quickstart cpp_own_classes cpp_testing)
     zelvo_script_test(${example}_runs check_output
         0 ${examples}/${example}.output $<TARGET_FILE:${example}>)
@@ -46,6 +46,13 @@ zelvo_script_test(faulty_json_is_noticed check_json_lines
 set_tests_properties(faulty_json_is_noticed PROPERTIES PASS_REGULAR_EXPRESSION
     "line 1: no JSON.*line 2: no JSON: a name comes twice.*line 3: half of a surr.*line 3: the time is not that.*line 4: the time is not RFC 3339.*line 4: another process.*the last line has no end")
 
+zelvo_script_test(problem_determination_runs check_output
+    0 ${examples}/problem_determination.output
+    $<TARGET_FILE:problem_determination> ${examples}/problem_determination/station.properties)
+set_tests_properties(problem_determination_runs PROPERTIES
+    WORKING_DIRECTORY ${PROJECT_BINARY_DIR}/examples)
+zelvo_script_test(daemon_lives check_daemon
+    $<TARGET_FILE:daemon> ${examples}/daemon/daemon.properties)
 zelvo_script_test(show_config_refuses_a_key_without_dot check_output
     1 ${examples}/properties/no_dot.output
     $<TARGET_FILE:show_config> ${examples}/properties/no_dot.properties)
@@ -55,7 +62,7 @@ zelvo_script_test(doc_snippets_are_real check_doc_snippets ${PROJECT_SOURCE_DIR}
 zelvo_script_test(an_invented_snippet_is_noticed check_doc_snippets
     ${PROJECT_SOURCE_DIR} ${CMAKE_CURRENT_SOURCE_DIR}/data/invented_snippet.md)
 set_tests_properties(an_invented_snippet_is_noticed PROPERTIES
-    PASS_REGULAR_EXPRESSION "not found under examples/:.*int invented")
+    PASS_REGULAR_EXPRESSION "not found under examples/ or packaging/:.*int invented")
 
 # Pages lead to files, folders and headings that are there.
 file(GLOB pages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/*.md)
