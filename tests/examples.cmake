@@ -28,7 +28,7 @@ foreach(example IN ITEMS record_layouts messages)
 endforeach()
 
 # What syslog(3) is told beside the text: a stand-in for it prints that.
-add_executable(syslog_handler_told ${examples}/syslog_handler.c c/SyslogStandIn.c)
+add_executable(syslog_handler_told ${examples}/syslog_handler.c support/SyslogStandIn.c)
 target_link_libraries(syslog_handler_told PRIVATE zelvo::zelvo zelvo_options)
 target_compile_options(syslog_handler_told PRIVATE -U_FORTIFY_SOURCE) # which would call another one
 get_target_property(definitions syslog_handler COMPILE_DEFINITIONS)
