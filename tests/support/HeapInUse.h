@@ -6,7 +6,7 @@
 
 #include <malloc.h>
 
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#ifdef ZELVO_SANITIZED
 // The sanitizers' own header does not come with every compiler.
 extern "C" size_t __sanitizer_get_current_allocated_bytes();
 #endif
@@ -17,7 +17,7 @@ namespace zelvo_test {
 /// mallinfo2.
 inline size_t heapInUse()
 {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#ifdef ZELVO_SANITIZED
     return __sanitizer_get_current_allocated_bytes();
 #else
     return mallinfo2().uordblks;

@@ -28,7 +28,7 @@ namespace zelvo_test {
     static constexpr auto getLink = Zlv##MEMBER##GetLink;                                          \
     static constexpr auto getIndex = Zlv##MEMBER##GetIndex;                                        \
     static constexpr auto remLink = Zlv##MEMBER##RemLink;                                          \
-    static constexpr auto sort = ZlvSort##MEMBER;
+    [[maybe_unused]] static constexpr auto sort = ZlvSort##MEMBER;
 
 template <class F>
 class ListFixture : public testing::Test {

@@ -28,8 +28,8 @@ namespace zelvo_test {
     static constexpr auto getKey = PREFIX##MEMBER##IterGetKey;                                     \
     static constexpr auto getVal = PREFIX##MEMBER##IterGetVal;                                     \
     static constexpr auto next = PREFIX##MEMBER##IterNext;                                         \
-    static constexpr auto getNode = zlvIntl##MEMBER##GetNode;                                      \
-    static constexpr auto remNode = zlvIntl##MEMBER##RemNode;
+    [[maybe_unused]] static constexpr auto getNode = zlvIntl##MEMBER##GetNode;                     \
+    [[maybe_unused]] static constexpr auto remNode = zlvIntl##MEMBER##RemNode;
 
 template <class F>
 class MapFixture : public testing::Test {

@@ -99,7 +99,7 @@ TEST_P(CxKvtIDFormat, IsNotFoundWithABytePastAsciiInAnyPosition)
 
 TEST_P(CxKvtIDFormat, IsNotFoundWithADigitInPlaceOfALeadingLetter)
 {
-    for (size_t at : {0, 1, 2}) {
+    for (size_t at : {0U, 1U, 2U}) {
         std::string text = sample_;
         text[at] = '7';
         EXPECT_TRUE(isNothing(CxParseKvtID(text.c_str()))) << text;

@@ -16,9 +16,10 @@ void append(Cases &cases, const Cases &more)
 /// Both forms of a call with the given arguments.
 #define CALLED(call, ...)                                                                          \
     specialCase("Zlv" #call, Kind::Logger,                                                         \
-                [](World &world) { return Zlv##call(with(world), ##__VA_ARGS__); }),               \
-        specialCase("zlvIntl" #call, Kind::Logger,                                                 \
-                    [](World &world) { return zlvIntl##call(with(world), ##__VA_ARGS__); })
+                [](World &world) { return Zlv##call(with(world) __VA_OPT__(, ) __VA_ARGS__); }),   \
+        specialCase("zlvIntl" #call, Kind::Logger, [](World &world) {                              \
+            return zlvIntl##call(with(world) __VA_OPT__(, ) __VA_ARGS__);                          \
+        })
 
 /// The world's configuration, which stands below "above" and has a child.
 ZlvObjCfg *with(World &world)
