@@ -9,6 +9,7 @@
  *  1. Life. ZlvOpenToolkit() comes first and ZlvCloseToolkit() last. Classes may be registered
  *     before. Closing frees every object, configuration and class, whoever still holds a reference:
  *     a handle kept across it must not be used, not even to release it.
+ *     What ICU has opened for records is kept until then: u_cleanup() comes after it.
  *
  *  2. Handles and references. Objects (ZlvObject) and configurations (ZlvObjCfg) are counted. What
  *     a call hands out carries a reference for the caller, who gives it back with
