@@ -35,9 +35,9 @@ typedef void (*ZlvFLog)(ZlvObject *object, ZlvEvent *event, va_list args);
 typedef void (*ZlvFProcess)(ZlvObject *listener, ZlvEvent *event, va_list args);
 /** Tells whether a filter accepts an event: it does when the result's low eight bits equal 1. */
 typedef int32_t (*ZlvFIsLoggable)(ZlvObject *filter, ZlvEvent *event, va_list args);
-/** Opens a handler's output. */
+/** Opens a handler's output. The toolkit calls it for nobody: a handler opens when it needs to. */
 typedef void (*ZlvFOpen)(ZlvObject *handler);
-/** Closes a handler's output. */
+/** Closes a handler's output, as the object is destroyed. */
 typedef void (*ZlvFClose)(ZlvObject *handler);
 /** Makes an event's record: new text that the caller frees with RkoMemoryFree(), or null. */
 typedef UChar *(*ZlvFFormat)(ZlvObject *formatter, ZlvEvent *event, va_list args);
@@ -45,7 +45,10 @@ typedef UChar *(*ZlvFFormat)(ZlvObject *formatter, ZlvEvent *event, va_list args
 typedef char *(*ZlvFGetHeader)(ZlvObject *formatter);
 /** Makes what stands last in an output: new text to free with RkoMemoryFree(), or null. */
 typedef char *(*ZlvFGetTrailer)(ZlvObject *formatter);
-/** Binds a message to its final text with the arguments of the logging call; new text or null. */
+/**
+ * Binds a message to its final text with the arguments of the logging call; new text or null. The
+ * format function of the class calls it, if that cares for it as ZlvBasicUFormatterFFormat() does.
+ */
 typedef UChar *(*ZlvFBindMsg)(ZlvI18Msg *message, va_list args);
 
 /**
@@ -85,7 +88,9 @@ struct ZlvObjClass {
 /**
  * Registers a class of loggers. The first registration of a name wins: a null name, a name that is
  * taken and exhausted memory register nothing, and nothing is reported. Works before the toolkit is
- * opened too; closing forgets the class.
+ * opened too; closing forgets the class. The built-in classes follow the very first registration,
+ * or come with the opening: that first class alone may have the name of one of them, and replaces
+ * it.
  *
  * @param name         class name, copied; compared exactly
  * @param description  copied; null for none

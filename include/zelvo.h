@@ -54,7 +54,8 @@
  *
  * 11. Class functions. They run with the mutex held. They may call the zlvIntl twins (ZlvIntl.h),
  *     the class functions of other classes and the calls of rule 10; a call that takes the mutex
- *     would wait for itself for ever. So would one that logs.
+ *     would wait for itself for ever. So would a public call that logs, at the first level that it
+ *     does not refuse: zlvLogUMessageEntry() and zlvLogUDebugEntry() log from there.
  *
  * 12. Iterators. An iterator points at an element and costs nothing to drop. It stays valid until
  *     its element is removed or its container is freed; elements appended later are met. Its getter
