@@ -27,8 +27,9 @@ def line(text):
 def paragraph(text):
     """The lines of one paragraph."""
     for sentence in SENTENCE.split(" ".join(text.split())):
-        for part in textwrap.wrap(sentence, 72, break_long_words=False, break_on_hyphens=False):
-            yield line(escape(part))
+        for part in textwrap.wrap(
+                escape(sentence), 78, break_long_words=False, break_on_hyphens=False):
+            yield line(part)
 
 
 def display(text):
