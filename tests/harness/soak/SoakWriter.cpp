@@ -115,9 +115,9 @@ public:
                 swallowNextWrite();
             refuseWrites(ledger_.board().isFull);
             log(own_, ownStream(), number);
+            refuseWrites(0); // the shared file, which chatter may roll over, has space
             if (number % RECORDS_FOR_A_CHATTER == 0)
                 chatter();
-            refuseWrites(0);
             usleep(pause); // waits for nothing: it keeps a long run small
         }
     }
