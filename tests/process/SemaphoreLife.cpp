@@ -44,6 +44,12 @@ std::string sets()
     return text;
 }
 
+/// Elsewhere sets come and go. Root needs no users of its own for it, which not every place allows.
+bool seesNoSetsOfOthers()
+{
+    return unshare(CLONE_NEWIPC) == 0 || unshare(CLONE_NEWUSER | CLONE_NEWIPC) == 0;
+}
+
 size_t openDescriptors()
 {
     const std::filesystem::directory_iterator all("/proc/self/fd");
@@ -73,8 +79,8 @@ INSTANTIATE_TEST_SUITE_P(Round, CreationRace, testing::Range(0, ROUNDS));
 
 TEST_F(SemaphoreLife, AThousandOpensAndClosesLeaveOneSetAndNoDescriptor)
 {
-    // Where that is allowed, nobody else's sets are seen.
-    static_cast<void>(unshare(CLONE_NEWUSER | CLONE_NEWIPC));
+    if (!seesNoSetsOfOthers())
+        GTEST_SKIP() << "no right to be alone with semaphores";
     logOnce();
     const std::string before = sets();
     const size_t descriptors = openDescriptors();
