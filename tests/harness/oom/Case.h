@@ -122,6 +122,11 @@ inline Case composite(Case call)
 
 using Cases = std::vector<Case>;
 
+inline void append(Cases &cases, const Cases &more)
+{
+    cases.insert(cases.end(), more.begin(), more.end());
+}
+
 /// The calls of the portability layer, the containers and the toolkit.
 void addPortabilityCases(Cases &cases);
 void addContainerCases(Cases &cases);

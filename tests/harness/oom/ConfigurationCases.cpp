@@ -1,17 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Configurations, the log manager that keeps them, and the reader that fills them from a file.
-#include "Case.h"
+#include "PlainCase.h"
 
 namespace zelvo_test {
 namespace {
-
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
-#define PLAIN(call) plainCase(#call, Kind::Logger, call)
-#define PAIR(call) PLAIN(Zlv##call), PLAIN(zlvIntl##call)
 
 /// Both forms of a call with the given arguments.
 #define CALLED(call, ...)                                                                          \

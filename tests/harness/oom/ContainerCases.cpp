@@ -8,11 +8,6 @@
 namespace zelvo_test {
 namespace {
 
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
 /// Both forms of an operation, with samples of its parameters.
 #define PLAIN(operation)                                                                           \
     plainCase("Zlv" #operation, Kind::Logger, Zlv##operation),                                     \

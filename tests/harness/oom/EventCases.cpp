@@ -2,19 +2,11 @@
 // Messages and events.
 #include <utility>
 
-#include "Case.h"
+#include "PlainCase.h"
 #include "ZlvLocaleName.h"
 
 namespace zelvo_test {
 namespace {
-
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
-#define PLAIN(call) plainCase(#call, Kind::Logger, call)
-#define PAIR(call) PLAIN(Zlv##call), PLAIN(zlvIntl##call)
 
 /// A text that is longer than the area in which texts are first made.
 constexpr const UChar *LONG_PATTERN =

@@ -6,11 +6,6 @@
 namespace zelvo_test {
 namespace {
 
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
 /// A file with something in it, so that there is something to roll over.
 void openWithContent(World *world)
 {

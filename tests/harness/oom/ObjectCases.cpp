@@ -1,18 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Classes, objects, their listeners and what their properties do.
-#include "Case.h"
+#include "PlainCase.h"
 #include "ZlvToolkitIntl.h"
 
 namespace zelvo_test {
 namespace {
-
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
-#define PLAIN(call) plainCase(#call, Kind::Logger, call)
-#define PAIR(call) PLAIN(Zlv##call), PLAIN(zlvIntl##call)
 
 /// Both forms of a call that gets nothing from the world.
 #define CALLED(call, ...)                                                                          \

@@ -1,12 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Properties of maps, objects, configurations and events.
-#include "Case.h"
+#include "PlainCase.h"
 
 namespace zelvo_test {
 namespace {
-
-#define PLAIN(call) plainCase(#call, Kind::Logger, call)
-#define PAIR(call) PLAIN(Zlv##call), PLAIN(zlvIntl##call)
 
 /// The getter and the setter of each type.
 #define EACH_TYPE(family, of)                                                                      \

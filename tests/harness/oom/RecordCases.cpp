@@ -6,11 +6,6 @@
 namespace zelvo_test {
 namespace {
 
-void append(Cases &cases, const Cases &more)
-{
-    cases.insert(cases.end(), more.begin(), more.end());
-}
-
 constexpr const char *BUNDLE = ZELVO_TEST_BUNDLES "/zelvomsg";
 
 /// An event with everything that a formatter shows.
